@@ -1,0 +1,34 @@
+// Carries a selection made on a reduced copy of a photo over to the photo itself.
+#pragma once
+
+#include <cstdint>
+
+#include "support/ze_api.h"
+
+extern "C" {
+
+// Transfers a rectangle of the small mask onto the large one. Each small pixel covers a block of
+// large ones. A block whose small pixel equals its right, lower and diagonal neighbour takes that
+// value; any other lies on the selection's edge, and its pixels are decided one by one by how near
+// they are in colour to the selected (flag 0) or equal (any other flag) pixels around.
+//
+//   small_mask    small_width * small_height bytes, rows small_width apart
+//   large_mask    rows large_width apart
+//   large_image   the photo under large_mask, pixels 0xAARRGGBB
+//   ratio         small size / large size, above 0
+//   left .. bottom  inclusive rectangle of the small mask
+//   flag          0 adds: edge blocks only gain 1s; any other value removes: they only gain 0s
+//
+// The seventh argument is not read. REQUIRES: the rectangle lies in the small mask; every block,
+// and one column and row beyond it, lies in the photo.
+//
+// Deliberate: mask bytes are compared whole, so foreign values are neither 0 nor 1. Block positions
+// are single-precision quotients, and positions beyond a row reach into the next. On the small
+// mask's last row and column only values equal to 1 - flag are copied. A uniform block is
+// overwritten whatever the flag.
+ZE_API void ze_modify_mask(unsigned char* small_mask, unsigned char* large_mask,
+                           uint32_t* large_image, int small_width, int small_height,
+                           int large_width, int, float ratio, int left, int right, int top,
+                           int bottom, int flag);
+
+}  // extern "C"

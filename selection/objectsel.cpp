@@ -1,0 +1,103 @@
+#include "selection/objectsel.h"
+
+#include <cstddef>
+#include <new>
+
+#include "selection/region_shaping.h"
+#include "support/log.h"
+#include "support/ze_alloc.h"
+
+ER_selection* g_ERBrush = nullptr;
+ze_rect g_object_boundary = {0, 0, 0, 0};
+ze_rect g_fill_boundary = {0, 0, 0, 0};
+int g_Brush_Radius = 10;
+int g_Brush_Center = 1;
+
+namespace {
+
+void build_engine() {
+    ze_destroy_objectsel();
+    g_ERBrush = new (std::nothrow) ER_selection;
+    if (g_ERBrush) g_ERBrush->initial(g_Brush_Radius, g_Brush_Center);
+}
+
+}  // namespace
+
+int ze_init_objectsel(int width, int height) {
+    g_object_boundary = empty_at_last_pixel(width, height);
+    build_engine();
+    return 1;
+}
+
+void ze_destroy_objectsel() {
+    delete g_ERBrush;
+    g_ERBrush = nullptr;
+}
+
+void ze_reset_objectsel(unsigned char* mask, int width, int height) {
+    if (!mask || width <= 0 || height <= 0) {
+        __android_log_print(ANDROID_LOG_INFO, LOG_TAG, "invalid input parameters\n");
+        return;
+    }
+    ze_memset(mask, 0, static_cast<size_t>(width) * static_cast<size_t>(height));
+    g_object_boundary = empty_at_last_pixel(width, height);
+}
+
+void ze_reinit_objectsel(unsigned char*, int, int, ze_rect) {}
+
+void ze_set_brush_size(int radius, int center) {
+    g_Brush_Radius = radius;
+    g_Brush_Center = center;
+    build_engine();
+}
+
+void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height, int x1, int y1,
+                         int, int, int mode, ze_rect* rect, int fill) {
+    *rect = empty_beyond_image(width, height);
+    if (!g_ERBrush) return;
+    switch (mode) {
+        case 0:
+            g_ERBrush->DoSelection(pixels, mask, width, height, x1, y1, rect);
+            break;
+        default:
+            return;
+    }
+    unite(&g_object_boundary, *rect);
+    if (fill != 1) return;
+    const ze_rect box = g_object_boundary;
+    Fill_Region(mask, width, height, box.left, box.right, box.top, box.bottom, rect);
+}
+
+void ze_inverse_mask(unsigned char* mask, int width, int height) {
+    g_object_boundary = empty_at_last_pixel(width, height);
+    for (int y = 0; y < height; ++y) {
+        unsigned char* const row = mask + ptrdiff_t{y} * width;
+        for (int x = 0; x < width; ++x) {
+            row[x] = row[x] != 1;
+            if (row[x] == 1) include(&g_object_boundary, x, y);
+        }
+    }
+}
+
+void ze_set_objectROI(ze_rect roi) { g_object_boundary = roi; }
+
+ze_rect ze_get_objectROI() { return g_object_boundary; }
+
+void ze_update_objectROI(unsigned char* mask, int width, int height) {
+    const ze_rect old = clip_to_image(g_object_boundary, width, height);
+    g_object_boundary = empty_beyond_image(width, height);
+    for (int y = old.top; y <= old.bottom; ++y) {
+        const unsigned char* const row = mask + ptrdiff_t{y} * width;
+        for (int x = old.left; x <= old.right; ++x) {
+            if (row[x] == 1) include(&g_object_boundary, x, y);
+        }
+    }
+}
+
+void ze_reset_fill_boundary(int width, int height) {
+    g_fill_boundary = empty_at_last_pixel(width, height);
+}
+
+int ze_get_brush_radius() { return g_Brush_Radius; }
+
+int ze_get_brush_center() { return g_Brush_Center; }

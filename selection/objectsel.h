@@ -1,0 +1,86 @@
+// The selection session: the flat API that the app's strokes arrive at.
+//
+// One session per process: one engine, the brush settings it is built from, and two rectangles, all
+// in the globals below. Nothing is re-entrant; call from one thread at a time. Photo and mask
+// belong to the caller and are never kept.
+//
+//   photo   width * height pixels 0xAARRGGBB, rows `width` apart
+//   mask    width * height bytes, rows `width` apart; 1 is selected, any other value is not
+//
+// Pointers and buffer lengths are never checked, sizes and coordinates only where it says so.
+#pragma once
+
+#include "selection/ER_selection.h"
+#include "selection/ze_rect.h"
+#include "support/ze_api.h"
+
+extern "C" {
+
+// The engine, or null before the first init or brush change and after ze_destroy_objectsel.
+ZE_API extern ER_selection* g_ERBrush;
+
+// Box of the selected object. Strokes that add widen it; strokes that remove leave it to
+// ze_update_objectROI or the erasing pass. {0, 0, 0, 0} before any call.
+ZE_API extern ze_rect g_object_boundary;
+
+// Deliberate: kept for the Java side's reset_fill_ROI; nothing in the library reads it.
+ZE_API extern ze_rect g_fill_boundary;
+
+// What the next engine is built from; they outlive every engine.
+ZE_API extern int g_Brush_Radius;  // pixels, 10 at first
+ZE_API extern int g_Brush_Center;  // radius of the core in pixels, 1 at first
+
+// Starts selecting on an image: a new engine from the brush globals, and an empty object box.
+// Returns 1, also when the engine's memory could not be had; strokes then do nothing.
+ZE_API int ze_init_objectsel(int width, int height);
+
+// Releases the engine. Brush globals and rectangles stay.
+ZE_API void ze_destroy_objectsel();
+
+// Clears width * height bytes of the mask and empties the object box. Bad input (no mask, a size
+// below 1) is logged and changes nothing.
+ZE_API void ze_reset_objectsel(unsigned char* mask, int width, int height);
+
+// Deliberate: does nothing; an entry point that the app calls.
+ZE_API void ze_reinit_objectsel(unsigned char* mask, int width, int height, ze_rect roi);
+
+// Sets the brush globals and builds a new engine from them, whether there was one or not and
+// whether the values changed or not. Any values are taken; see ER_selection::initial.
+ZE_API void ze_set_brush_size(int radius, int center);
+
+// One point or segment of a stroke.
+//
+//   pixels  the photo; used by growing only
+//   x1, y1  the point
+//   x2, y2  not used
+//   mode    0 grows along the photo's edges; any other value does nothing
+//   rect    out: first {width, 0, height, 0}, then widened over what the stroke and its fill
+//           touched; all that happens without an engine or with an unknown mode
+//   fill    1 exactly: fills the holes of what lies in the object box afterwards
+//
+// The object box is widened by rect before the fill, and not again after it.
+ZE_API void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height, int x1,
+                                int y1, int x2, int y2, int mode, ze_rect* rect, int fill);
+
+// Makes 1 of every byte that is not 1, and 0 of every 1; the object box becomes that of the new
+// selection, or {width - 1, 0, height - 1, 0} when nothing is selected.
+ZE_API void ze_inverse_mask(unsigned char* mask, int width, int height);
+
+// Stores the object box as it is: unordered and beyond the image too.
+ZE_API void ze_set_objectROI(ze_rect roi);
+ZE_API ze_rect ze_get_objectROI();
+
+// Shrinks the object box to the selected pixels inside it, or to {width, 0, height, 0} when there
+// are none.
+//
+// Deliberate: never looks outside the old box, which only strokes widen. Right after
+// ze_init_objectsel the old box is empty and so is the new one, whatever the mask holds.
+ZE_API void ze_update_objectROI(unsigned char* mask, int width, int height);
+
+// Sets g_fill_boundary to {width - 1, 0, height - 1, 0}.
+ZE_API void ze_reset_fill_boundary(int width, int height);
+
+ZE_API int ze_get_brush_radius();
+ZE_API int ze_get_brush_center();
+
+}  // extern "C"
