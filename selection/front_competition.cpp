@@ -100,16 +100,18 @@ public:
     // is empty or found broken.
     void grow() {
         while (!queue.empty()) {
-            const node* const n = queue.pop();
-            if (!in_image(n->x, n->y) || !Rules::is_open(mask_at(n->x, n->y))) continue;
-            unsigned char& pixel = mask_at(n->x, n->y);
-            if (n->label == 1) {
+            // A copy: with a list left over from an earlier stroke, the record may be handed out anew
+            // for a neighbour.
+            const node n = *queue.pop();
+            if (!in_image(n.x, n.y) || !Rules::is_open(mask_at(n.x, n.y))) continue;
+            unsigned char& pixel = mask_at(n.x, n.y);
+            if (n.label == 1) {
                 pixel = WON_BY_STROKE;
             } else {
                 pixel = pixel == Rules::SEED_VALUE ? KEPT_LIKE_SEEDS : KEPT_OTHER;
             }
             for (int d = LEFT; d < DIRECTIONS; ++d) {
-                if (!offer(*n, static_cast<direction>(d))) return;
+                if (!offer(n, static_cast<direction>(d))) return;
             }
         }
     }
