@@ -40,10 +40,12 @@ public:
         for (int64_t y = first_y; y <= last_y; ++y) sample(x, y);
     }
 
-    // REQUIRES: a sample was taken.
+    // REQUIRES: a sample was taken. Every edge block takes one: some neighbour differs from it.
     colour average() const {
-        return {static_cast<int>(red / count), static_cast<int>(green / count),
-                static_cast<int>(blue / count)};
+        const auto mean = [this](int64_t sum) {
+            return static_cast<int>(sum / count);  // NOLINT(clang-analyzer-core.DivideZero)
+        };
+        return {mean(red), mean(green), mean(blue)};
     }
 
 private:

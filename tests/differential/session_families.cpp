@@ -113,7 +113,7 @@ private:
 std::string run_session(random_source& random, tally* seen) {
     session_pair session(random);
     for (int calls = random.between(1, 40); calls > 0; --calls) {
-        const std::string difference = session.call();
+        std::string difference = session.call();
         if (!difference.empty()) return difference;
         (*seen)["calls"]++;
     }

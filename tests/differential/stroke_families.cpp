@@ -51,7 +51,7 @@ struct engine_pair {
     }
 
     std::string compare_costs() const {
-        const std::string difference = first_difference("cost_h", library.cost_h, model.cost_h);
+        std::string difference = first_difference("cost_h", library.cost_h, model.cost_h);
         return difference.empty() ? first_difference("cost_v", library.cost_v, model.cost_v)
                                   : difference;
     }
@@ -82,7 +82,7 @@ std::string run_strokes(random_source& random, tally* seen, stroke library_strok
             sprinkle(random, &s.mask, 0, 255);
             s.model_mask = s.mask;
         }
-        const std::string difference =
+        std::string difference =
             engines.stroke_at(&s, random.between(-2, s.width + 1), random.between(-2, s.height + 1),
                               library_stroke, stroke_of_model);
         if (!difference.empty()) return difference;
@@ -105,7 +105,7 @@ std::string run_tiny_strokes(random_source& random, tally* seen, stroke library_
             if (random.one_in(2)) sprinkle(random, &s.mask, 0, random.any_of({1, 4, 5, 7}));
             s.model_mask = s.mask;
         }
-        const std::string difference =
+        std::string difference =
             engines.stroke_at(&s, random.between(0, s.width - 1), random.between(0, s.height - 1),
                               library_stroke, stroke_of_model);
         if (!difference.empty()) return difference;
