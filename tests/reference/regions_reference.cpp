@@ -60,6 +60,7 @@ int direction_of(const point& wanted) {
 }
 
 rect cut_to_image(const rect& box, int width, int height) {
+    if (width <= 0 || height <= 0) return {0, -1, 0, -1};
     return {std::max(box.left, 0), std::min(box.right, width - 1), std::max(box.top, 0),
             std::min(box.bottom, height - 1)};
 }

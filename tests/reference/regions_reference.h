@@ -4,6 +4,7 @@
 // A box that reaches beyond the image is cut to the image. Sizes of 0 or less leave no pixel.
 #pragma once
 
+#include <cstddef>
 #include <vector>
 
 #include "tests/reference/basics_reference.h"
