@@ -100,8 +100,8 @@ public:
     // is empty or found broken.
     void grow() {
         while (!queue.empty()) {
-            // A copy: with a list left over from an earlier stroke, the record may be handed out anew
-            // for a neighbour.
+            // A copy: with a list left over from an earlier stroke, the record may be handed out
+            // anew for a neighbour.
             const node n = *queue.pop();
             if (!in_image(n.x, n.y) || !Rules::is_open(mask_at(n.x, n.y))) continue;
             unsigned char& pixel = mask_at(n.x, n.y);
@@ -228,6 +228,34 @@ private:
     const ptrdiff_t side;
 };
 
+// Shrinking: pixels won by the stroke become unselected.
+struct shrinking {
+    // The keep front starts on selected rim pixels.
+    static constexpr unsigned char SEED_VALUE = 1;
+
+    // Deliberate: so keep seeds are missing at the right and at the bottom of the brush.
+    static constexpr int UNSEEDED_EDGE = 1;
+
+    static constexpr bool CLEARS_SPARE = false;
+
+    // The point must be selected.
+    static bool may_start(const unsigned char* mask, int width, int height, int x, int y) {
+        return x >= 0 && x < width && y >= 0 && y < height && mask[x + ptrdiff_t{y} * width] == 1;
+    }
+
+    // Deliberate: foreign values are won like any other and then count as not selected.
+    static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
+
+    // Deliberate: foreign values that no front reached stay, and rect covers pixels that the keep
+    // front reached and that were unselected all along.
+    static bool settle(unsigned char* pixel) {
+        if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
+        if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;
+        *pixel = 0;
+        return true;
+    }
+};
+
 // Runs one stroke at (x, y); see ER_selection for the arguments. Does nothing on an engine without
 // all its buffers.
 //
@@ -253,4 +281,9 @@ void compete(ER_selection* engine, int* image, unsigned char* mask, int width, i
 void ER_selection::DoSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
                                ze_rect* rect) {
     compete<growing>(this, image, mask, width, height, x, y, rect);
+}
+
+void ER_selection::DeSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
+                               ze_rect* rect) {
+    compete<shrinking>(this, image, mask, width, height, x, y, rect);
 }

@@ -81,7 +81,7 @@ std::vector<run_state> chosen_families(const options& o) {
     std::vector<run_state> runs;
     std::string known;
     for (const auto* families : {&queue_families, &stroke_families, &region_families,
-                                 &session_families, &rendering_families}) {
+                                 &session_families, &rendering_families, &fixed_point_families}) {
         for (const family& f : *families) {
             known += std::string(" ") + f.name;
             bool wanted = o.families.empty();
