@@ -1,0 +1,115 @@
+package com.velt.android.orvane.lumetrix.desktop;
+
+import android.graphics.Point;
+import android.graphics.Rect;
+import java.io.IOException;
+import java.util.List;
+import java.util.function.Function;
+
+/** One line of a script, after the photo. */
+sealed interface Command {
+    /** Returns the line in the script, counted from 1. */
+    int line();
+
+    /** Throws when the command does not fit the photo. */
+    default void check(Photo photo) throws ScriptException {}
+
+    /** Performs the command. */
+    void perform(Stage stage) throws IOException;
+
+    /** Sets the brush for the strokes that follow. */
+    record Brush(int line, int radius, int core) implements Command {
+        @Override
+        public void perform(Stage stage) {
+            stage.session().setBrush(radius, core);
+        }
+    }
+
+    /** Switches filling on or off for the strokes that follow. */
+    record Fill(int line, boolean on) implements Command {
+        @Override
+        public void perform(Stage stage) {
+            stage.session().setFill(on);
+        }
+    }
+
+    /** A stroke of the brush: grow, shrink, paint or erase. */
+    record Stroke(int line, Mode mode, DabPath path) implements Command {
+        @Override
+        public void check(Photo photo) throws ScriptException {
+            checkInside(path.points(), photo, line);
+        }
+
+        @Override
+        public void perform(Stage stage) {
+            int spacing = DabPath.spacing(stage.session().brushRadius());
+            List<Point> dabs = path.dabs(spacing);
+            Rect changed = stage.session().brush(mode, dabs);
+            String where = span(path.points()) + " " + count(dabs.size(), "dab");
+            addRow(stage, line, mode.toString(), where, changed);
+        }
+    }
+
+    /** A closed lasso, adding or removing. */
+    record Lasso(int line, Mode mode, List<Point> corners) implements Command {
+        @Override
+        public void check(Photo photo) throws ScriptException {
+            checkInside(corners, photo, line);
+        }
+
+        @Override
+        public void perform(Stage stage) {
+            Rect changed = stage.session().lasso(mode, corners);
+            String where = span(corners) + " " + count(corners.size(), "corner");
+            addRow(stage, line, mode.toString(), where, changed);
+        }
+    }
+
+    /** Something done to the whole selection. */
+    record Whole(int line, String what, Function<EditingSession, Rect> operation)
+            implements Command {
+        @Override
+        public void perform(Stage stage) {
+            addRow(stage, line, what, "", operation.apply(stage.session()));
+        }
+    }
+
+    /** A picture of the selection as it stands. */
+    record Snapshot(int line, String name, Function<EditingSession, Picture> drawing)
+            implements Command {
+        @Override
+        public void perform(Stage stage) throws IOException {
+            stage.pictures().write(name, drawing.apply(stage.session()));
+        }
+    }
+
+    private static void addRow(Stage stage, int line, String what, String where, Rect changed) {
+        EditingSession session = stage.session();
+        stage.table().row(line, what, where, changed, session.selectedPixels(),
+                session.objectBox());
+    }
+
+    private static void checkInside(List<Point> points, Photo photo, int line)
+            throws ScriptException {
+        for (Point p : points) {
+            boolean inside = p.x >= 0 && p.x < photo.width() && p.y >= 0 && p.y < photo.height();
+            if (inside) continue;
+            throw new ScriptException(line, "the point " + describe(p) + " lies outside the photo",
+                    "0,0 to " + (photo.width() - 1) + "," + (photo.height() - 1));
+        }
+    }
+
+    private static String span(List<Point> points) {
+        String first = describe(points.get(0));
+        if (points.size() == 1) return first;
+        return first + " .. " + describe(points.get(points.size() - 1));
+    }
+
+    private static String describe(Point p) {
+        return p.x + "," + p.y;
+    }
+
+    private static String count(int number, String what) {
+        return "(" + number + " " + what + (number == 1 ? ")" : "s)");
+    }
+}

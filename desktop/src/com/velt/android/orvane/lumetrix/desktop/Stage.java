@@ -1,0 +1,10 @@
+package com.velt.android.orvane.lumetrix.desktop;
+
+/**
+ * What commands act on.
+ *
+ * @param session the photo being edited
+ * @param table receives a row from each command that works on the selection
+ * @param pictures receives the pictures
+ */
+record Stage(EditingSession session, StrokeTable table, PictureFolder pictures) {}

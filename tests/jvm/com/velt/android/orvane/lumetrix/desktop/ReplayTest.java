@@ -1,0 +1,50 @@
+package com.velt.android.orvane.lumetrix.desktop;
+
+import static org.junit.jupiter.api.Assertions.assertEquals;
+
+import java.io.IOException;
+import java.nio.file.Files;
+import java.nio.file.Path;
+import java.util.List;
+import org.junit.jupiter.api.io.TempDir;
+import org.junit.jupiter.params.ParameterizedTest;
+import org.junit.jupiter.params.provider.ValueSource;
+
+/** Replays the project's scripts; {@code -Ddesktop.folder=} names their folder. */
+class ReplayTest {
+    private static final Path DESKTOP = Path.of(System.getProperty("desktop.folder", "desktop"));
+
+    @TempDir
+    private Path folder;
+
+    @ParameterizedTest
+    @ValueSource(strings = {"fig", "dandelion"})
+    void scriptEndsWithItsDigest(String name) throws IOException, InterruptedException {
+        String expected = Files.readString(DESKTOP.resolve("scripts/" + name + ".digest")).strip();
+        Path script = beside(name);
+
+        PlayerRun run = PlayerRun.of(script, "--out", folder.resolve("out"), "--expect", expected);
+
+        assertEquals(List.of(), run.err());
+        assertEquals("digest " + expected, run.out().get(run.out().size() - 1));
+        assertEquals(0, run.status());
+    }
+
+    /**
+     * Copies a script beside a folder of photos in which its photo is stored as PNG; the name stays
+     * as the script has it, since files are recognised by their content.
+     */
+    private Path beside(String name) throws IOException, InterruptedException {
+        String fileName = "photos/" + name + ".jpg";
+        Files.createDirectories(folder.resolve("photos"));
+        ChildJvm conversion = ChildJvm.run(folder, JpegToPng.class,
+                DESKTOP.resolve(fileName).toString(), folder.resolve(fileName).toString());
+        assertEquals("", conversion.err());
+        assertEquals(0, conversion.status());
+
+        Path scripts = Files.createDirectories(folder.resolve("scripts"));
+        String scriptName = name + ".strokes";
+        return Files.copy(DESKTOP.resolve("scripts").resolve(scriptName),
+                scripts.resolve(scriptName));
+    }
+}
