@@ -1,0 +1,21 @@
+// Makes the library run out of memory at a chosen allocation.
+//
+// The test program brings its own operator new(nothrow) and new[](nothrow), which the engine's
+// buffers come from, and is linked with --wrap=calloc, which the region passes' work buffers come
+// from. Both count here, in one row; all other allocations are left alone.
+#pragma once
+
+class failing_allocations {
+public:
+    enum extent { ONCE, FROM_THEN_ON };
+
+    // While this object lives, the nth allocation (the first is 1) yields null, and with
+    // FROM_THEN_ON so does every later one. With 0 they are only counted. One object at a time.
+    explicit failing_allocations(int nth, extent how_long = ONCE);
+    ~failing_allocations();
+    failing_allocations(const failing_allocations&) = delete;
+    failing_allocations& operator=(const failing_allocations&) = delete;
+
+    // Allocations asked for since this object was made, those that failed included.
+    int asked() const;
+};
