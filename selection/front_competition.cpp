@@ -132,13 +132,17 @@ private:
         int left, right, top, bottom;
     };
 
-    // The brush square without its last `omitted` rows and columns, clipped to the image.
+    // The brush square without its last `omitted` rows and columns, clipped to the image; empty
+    // for a negative radius.
     window square_in_image(int omitted) const {
         const int64_t r = engine.radius;
-        return {static_cast<int>(std::max<int64_t>(x - r, 0)),
-                static_cast<int>(std::min<int64_t>(x + r - omitted, width - int64_t{1})),
-                static_cast<int>(std::max<int64_t>(y - r, 0)),
-                static_cast<int>(std::min<int64_t>(y + r - omitted, height - int64_t{1}))};
+        const auto first = [r](int centre, int size) {
+            return static_cast<int>(std::clamp<int64_t>(centre - r, 0, size));
+        };
+        const auto last = [r, omitted](int centre, int size) {
+            return static_cast<int>(std::clamp<int64_t>(centre + r - omitted, -1, size - 1));
+        };
+        return {first(x, width), last(x, width), first(y, height), last(y, height)};
     }
 
     ptrdiff_t cell_at(int px, int py) const {
