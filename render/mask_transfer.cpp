@@ -153,6 +153,7 @@ struct large_picture {
 void ze_modify_mask(unsigned char* small_mask, unsigned char* large_mask, uint32_t* large_image,
                     int small_width, int small_height, int large_width, int, float ratio, int left,
                     int right, int top, int bottom, int flag) {
+    if (!(ratio > 0)) return;
     const large_picture large = {large_mask, large_image, large_width};
     const int copied_at_end = wrap_sub(1, flag);
     const auto block_start = [ratio](int64_t small) {

@@ -15,7 +15,7 @@ extern "C" {
 //   small_mask    small_width * small_height bytes, rows small_width apart
 //   large_mask    rows large_width apart
 //   large_image   the photo under large_mask, pixels 0xAARRGGBB
-//   ratio         small size / large size, above 0
+//   ratio         small size / large size; does nothing unless above 0
 //   left .. bottom  inclusive rectangle of the small mask
 //   flag          0 adds: edge blocks only gain 1s; any other value removes: they only gain 0s
 //

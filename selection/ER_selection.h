@@ -66,6 +66,38 @@ public:
     void DoSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
                      ze_rect* rect);
 
+    // Shrinks the selection from the brush core at (x, y) along the photo's edges: DoSelection with
+    // the roles of selected and not selected exchanged, as far as front_competition.cpp's two rule
+    // types say. Arguments as there; rect is widened over every pixel that a front made 0.
+    //
+    // Nothing happens when the point lies outside the image or is not selected.
+    void DeSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
+                     ze_rect* rect);
+
+    // Paints the brush at (x, y): makes 1 of 0, or 0 of 1, in every cell of the brush inside the
+    // image. Other values stay. rect is widened over the pixels that changed. The point may lie
+    // anywhere.
+    //
+    // Deliberate: the last row and column of the square are never painted, so the disc lacks its
+    // right and lower rim; a radius of 0 paints nothing.
+    void Brush_Add(unsigned char* mask, int width, int height, int x, int y, ze_rect* rect);
+    void Brush_Del(unsigned char* mask, int width, int height, int x, int y, ze_rect* rect);
+
+    // Draws a segment of a lasso's outline from (x0, y0) to (x1, y1), both included: one pixel for
+    // each step along its longer axis. The value drawn remembers the pixel: adding makes 1 of 0 and
+    // 5 of anything else, removing makes 4 of 1 and 3 of anything else. ze_lasso_add_fill_mask and
+    // ze_lasso_del_fill_mask turn them back. rect is widened over every pixel drawn.
+    //
+    // Nothing happens when an end lies outside the image. No brush is needed: both work on an
+    // engine without buffers too.
+    //
+    // Deliberate: a pixel drawn twice, such as the joint of two segments, ends as 5 or 3, whatever
+    // it held at first.
+    void Lasso_Add(unsigned char* mask, int width, int height, int x0, int y0, int x1, int y1,
+                   ze_rect* rect);
+    void Lasso_Del(unsigned char* mask, int width, int height, int x0, int y0, int x1, int y1,
+                   ze_rect* rect);
+
     // Public, in a fixed order. All arrays but node_pool have one entry per cell of the square.
     unsigned char* brush_map;  // owned; brush_class of each cell
     node* node_pool;           // owned; brush_cells + 1 records, handed out in order by a stroke

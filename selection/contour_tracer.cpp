@@ -21,12 +21,10 @@ bool contains(const ze_rect& box, int x, int y) {
     return x >= box.left && x <= box.right && y >= box.top && y <= box.bottom;
 }
 
-// One byte per position from (-1, -1) to (width, height); SIZE_MAX, which no allocation grants, for
-// sizes that make no buffer.
+// One byte per position from (-1, -1) to (width, height), or 0 for sizes that make no buffer.
 size_t marker_bytes(int width, int height) {
     const int64_t bytes = (int64_t{width} + 2) * (int64_t{height} + 2);
-    return bytes < 0 || static_cast<uint64_t>(bytes) > SIZE_MAX ? SIZE_MAX
-                                                                : static_cast<size_t>(bytes);
+    return bytes < 0 || bytes > PTRDIFF_MAX ? 0 : static_cast<size_t>(bytes);
 }
 
 }  // namespace
@@ -34,7 +32,7 @@ size_t marker_bytes(int width, int height) {
 marker_buffer::marker_buffer(int mask_width, int mask_height)
     : width(mask_width),
       size(marker_bytes(mask_width, mask_height)),
-      bytes(static_cast<unsigned char*>(ze_calloc(size, 1))) {}
+      bytes(size == 0 ? nullptr : static_cast<unsigned char*>(ze_calloc(size, 1))) {}
 
 marker_buffer::~marker_buffer() { ze_free(bytes); }
 

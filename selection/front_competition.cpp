@@ -100,8 +100,8 @@ public:
     // is empty or found broken.
     void grow() {
         while (!queue.empty()) {
-            // A copy: with a list left over from an earlier stroke, the record may be handed out anew
-            // for a neighbour.
+            // A copy: with a list left over from an earlier stroke, the record may be handed out
+            // anew for a neighbour.
             const node n = *queue.pop();
             if (!in_image(n.x, n.y) || !Rules::is_open(mask_at(n.x, n.y))) continue;
             unsigned char& pixel = mask_at(n.x, n.y);
@@ -132,13 +132,17 @@ private:
         int left, right, top, bottom;
     };
 
-    // The brush square without its last `omitted` rows and columns, clipped to the image.
+    // The brush square without its last `omitted` rows and columns, clipped to the image; empty
+    // for a negative radius.
     window square_in_image(int omitted) const {
         const int64_t r = engine.radius;
-        return {static_cast<int>(std::max<int64_t>(x - r, 0)),
-                static_cast<int>(std::min<int64_t>(x + r - omitted, width - int64_t{1})),
-                static_cast<int>(std::max<int64_t>(y - r, 0)),
-                static_cast<int>(std::min<int64_t>(y + r - omitted, height - int64_t{1}))};
+        const auto first = [r](int centre, int size) {
+            return static_cast<int>(std::clamp<int64_t>(centre - r, 0, size));
+        };
+        const auto last = [r, omitted](int centre, int size) {
+            return static_cast<int>(std::clamp<int64_t>(centre + r - omitted, -1, size - 1));
+        };
+        return {first(x, width), last(x, width), first(y, height), last(y, height)};
     }
 
     ptrdiff_t cell_at(int px, int py) const {
@@ -228,6 +232,34 @@ private:
     const ptrdiff_t side;
 };
 
+// Shrinking: pixels won by the stroke become unselected.
+struct shrinking {
+    // The keep front starts on selected rim pixels.
+    static constexpr unsigned char SEED_VALUE = 1;
+
+    // Deliberate: so keep seeds are missing at the right and at the bottom of the brush.
+    static constexpr int UNSEEDED_EDGE = 1;
+
+    static constexpr bool CLEARS_SPARE = false;
+
+    // The point must be selected.
+    static bool may_start(const unsigned char* mask, int width, int height, int x, int y) {
+        return x >= 0 && x < width && y >= 0 && y < height && mask[x + ptrdiff_t{y} * width] == 1;
+    }
+
+    // Deliberate: foreign values are won like any other and then count as not selected.
+    static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
+
+    // Deliberate: foreign values that no front reached stay, and rect covers pixels that the keep
+    // front reached and that were unselected all along.
+    static bool settle(unsigned char* pixel) {
+        if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
+        if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;
+        *pixel = 0;
+        return true;
+    }
+};
+
 // Runs one stroke at (x, y); see ER_selection for the arguments. Does nothing on an engine without
 // all its buffers.
 //
@@ -253,4 +285,9 @@ void compete(ER_selection* engine, int* image, unsigned char* mask, int width, i
 void ER_selection::DoSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
                                ze_rect* rect) {
     compete<growing>(this, image, mask, width, height, x, y, rect);
+}
+
+void ER_selection::DeSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
+                               ze_rect* rect) {
+    compete<shrinking>(this, image, mask, width, height, x, y, rect);
 }

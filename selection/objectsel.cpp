@@ -15,6 +15,30 @@ int g_Brush_Center = 1;
 
 namespace {
 
+enum stroke_mode { GROW, SHRINK, PAINT, ERASE, LASSO_ADD, LASSO_REMOVE };
+
+// Runs the pass on whole regions that belongs to a mode.
+void complete_regions(unsigned char* mask, int width, int height, int mode, ze_rect* rect) {
+    const ze_rect box = g_object_boundary;
+    switch (mode) {
+        case GROW:
+        case PAINT:
+            Fill_Region(mask, width, height, box.left, box.right, box.top, box.bottom, rect);
+            break;
+        case SHRINK:
+            Erase_Region(mask, width, height, &g_object_boundary, rect);
+            break;
+        case LASSO_ADD:
+            ze_lasso_add_fill_mask(mask, width, height, box.left, box.right, box.top, box.bottom);
+            break;
+        case LASSO_REMOVE:
+            ze_lasso_del_fill_mask(mask, width, height, box.left, box.right, box.top, box.bottom);
+            break;
+        default:  // ERASE has none
+            break;
+    }
+}
+
 void build_engine() {
     ze_destroy_objectsel();
     g_ERBrush = new (std::nothrow) ER_selection;
@@ -52,20 +76,33 @@ void ze_set_brush_size(int radius, int center) {
 }
 
 void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height, int x1, int y1,
-                         int, int, int mode, ze_rect* rect, int fill) {
+                         int x2, int y2, int mode, ze_rect* rect, int fill) {
     *rect = empty_beyond_image(width, height);
     if (!g_ERBrush) return;
     switch (mode) {
-        case 0:
+        case GROW:
             g_ERBrush->DoSelection(pixels, mask, width, height, x1, y1, rect);
+            break;
+        case SHRINK:
+            g_ERBrush->DeSelection(pixels, mask, width, height, x1, y1, rect);
+            break;
+        case PAINT:
+            g_ERBrush->Brush_Add(mask, width, height, x1, y1, rect);
+            break;
+        case ERASE:
+            g_ERBrush->Brush_Del(mask, width, height, x1, y1, rect);
+            break;
+        case LASSO_ADD:
+            g_ERBrush->Lasso_Add(mask, width, height, x1, y1, x2, y2, rect);
+            break;
+        case LASSO_REMOVE:
+            g_ERBrush->Lasso_Del(mask, width, height, x1, y1, x2, y2, rect);
             break;
         default:
             return;
     }
-    unite(&g_object_boundary, *rect);
-    if (fill != 1) return;
-    const ze_rect box = g_object_boundary;
-    Fill_Region(mask, width, height, box.left, box.right, box.top, box.bottom, rect);
+    if (mode != SHRINK && mode != ERASE) unite(&g_object_boundary, *rect);
+    if (fill == 1) complete_regions(mask, width, height, mode, rect);
 }
 
 void ze_inverse_mask(unsigned char* mask, int width, int height) {

@@ -48,17 +48,26 @@ ZE_API void ze_reinit_objectsel(unsigned char* mask, int width, int height, ze_r
 // whether the values changed or not. Any values are taken; see ER_selection::initial.
 ZE_API void ze_set_brush_size(int radius, int center);
 
-// One point or segment of a stroke.
+// One point of a brush stroke, or one segment of a lasso.
 //
-//   pixels  the photo; used by growing only
-//   x1, y1  the point
-//   x2, y2  not used
-//   mode    0 grows along the photo's edges; any other value does nothing
-//   rect    out: first {width, 0, height, 0}, then widened over what the stroke and its fill
-//           touched; all that happens without an engine or with an unknown mode
-//   fill    1 exactly: fills the holes of what lies in the object box afterwards
+//   pixels  the photo; used by modes 0 and 1
+//   x1, y1  the point, or the segment's start
+//   x2, y2  the segment's end; used by modes 4 and 5
+//   rect    out: first {width, 0, height, 0}, then widened over what the stroke touched; all that
+//           happens without an engine or with an unknown mode
+//   fill    1 exactly: then also runs the mode's pass over the object box
 //
-// The object box is widened by rect before the fill, and not again after it.
+//   mode  stroke                                 object box        pass
+//   0     grows along the photo's edges          widened by rect   fills holes, widens rect
+//   1     shrinks along the photo's edges        stays             keeps the largest region, widens
+//                                                                  rect and rebuilds the object box
+//   2     paints the brush                       widened by rect   fills holes, widens rect
+//   3     erases the brush                       stays             none
+//   4     draws a segment of an adding lasso     widened by rect   selects what it encloses
+//   5     draws a segment of a removing lasso    widened by rect   clears what it encloses
+//
+// The object box is widened before the pass and not again after it. Deliberate: mode 5 widens it
+// although it removes pixels.
 ZE_API void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height, int x1,
                                 int y1, int x2, int y2, int mode, ze_rect* rect, int fill);
 

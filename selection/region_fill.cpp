@@ -1,4 +1,5 @@
 #include "selection/contour_tracer.h"
+#include "selection/lasso_values.h"
 #include "selection/region_shaping.h"
 
 namespace {
@@ -15,6 +16,15 @@ struct fill_rules {
 };
 
 constexpr fill_rules HOLES = {value_set(1), value_set(1, VISITED), value_set(VISITED), 1};
+
+constexpr fill_rules ADDING_LASSO = {value_set(ADDED_NEW, ADDED_OVER),
+                                     value_set(ADDED_NEW, ADDED_OVER, VISITED),
+                                     value_set(ADDED_OVER, VISITED), 1};
+
+// The selection is no region here: the fill reaches it from the outline around it.
+constexpr fill_rules REMOVING_LASSO = {value_set(REMOVED_OTHER, REMOVED_SELECTED),
+                                       value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED),
+                                       value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED), 0};
 
 // Sets what lies between left and right contour pixels to VISITED. Widens `filled`, where there is
 // one, over pixels that were 0.
@@ -65,4 +75,14 @@ int fill_regions(const fill_rules& rules, unsigned char* cells, int width, int h
 void Fill_Region(unsigned char* mask, int width, int height, int left, int right, int top,
                  int bottom, ze_rect* rect) {
     fill_regions(HOLES, mask, width, height, {left, right, top, bottom}, rect);
+}
+
+int ze_lasso_add_fill_mask(unsigned char* mask, int width, int height, int left, int right, int top,
+                           int bottom) {
+    return fill_regions(ADDING_LASSO, mask, width, height, {left, right, top, bottom}, nullptr);
+}
+
+int ze_lasso_del_fill_mask(unsigned char* mask, int width, int height, int left, int right, int top,
+                           int bottom) {
+    return fill_regions(REMOVING_LASSO, mask, width, height, {left, right, top, bottom}, nullptr);
 }

@@ -25,4 +25,32 @@ extern "C" {
 ZE_API void Fill_Region(unsigned char* mask, int width, int height, int left, int right, int top,
                         int bottom, ze_rect* rect);
 
+// Keeps the region of the selection with the largest interior and erases all others inside a box.
+//
+//   boundary  in: the box, of which the part inside the image counts; out: the box of what is left
+//             selected in it, or {width, 0, height, 0}
+//   rect      widened over every pixel erased; not reset
+//
+// With one region nothing is erased. When the work buffer cannot be had the mask stays as it is.
+//
+// Deliberate:
+// - boundary is emptied before anything can fail, and stays so on failure.
+// - A region's size is the number of pixels inside its contour; among equals, the one found last,
+// row
+//   by row, survives. Thin regions all count 0.
+ZE_API void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
+                         ze_rect* rect);
+
+// Selects what an adding lasso's outline, together with the selection that it touches, encloses,
+// and makes 1 of the outline values 1 and 5 in the box. Box and memory as for Fill_Region.
+//
+// Returns 0 when the work buffer cannot be had (the mask then stays as it is), otherwise 1.
+ZE_API int ze_lasso_add_fill_mask(unsigned char* mask, int width, int height, int left, int right,
+                                  int top, int bottom);
+
+// Clears what a removing lasso's outline encloses, and the outline values 3 and 4 in the box.
+// Selected pixels outside stay. Result, box and memory as for ze_lasso_add_fill_mask.
+ZE_API int ze_lasso_del_fill_mask(unsigned char* mask, int width, int height, int left, int right,
+                                  int top, int bottom);
+
 }  // extern "C"

@@ -24,6 +24,7 @@ extern const std::vector<family> stroke_families;
 extern const std::vector<family> region_families;
 extern const std::vector<family> session_families;
 extern const std::vector<family> rendering_families;
+extern const std::vector<family> fixed_point_families;
 
 // Names the first element in which two equally long arrays differ; "" when they are equal.
 template <class A, class B>

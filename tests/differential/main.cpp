@@ -7,7 +7,7 @@
 #include <cinttypes>
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -39,6 +39,7 @@ struct run_state {
     uint64_t cases = 0;
     double seconds = 0;
     tally seen;
+    std::map<std::string, uint64_t> first_case;  // in which each thing seen came up first
 };
 
 [[noreturn]] void refuse(const std::string& why) {
@@ -81,12 +82,12 @@ std::vector<run_state> chosen_families(const options& o) {
     std::vector<run_state> runs;
     std::string known;
     for (const auto* families : {&queue_families, &stroke_families, &region_families,
-                                 &session_families, &rendering_families}) {
+                                 &session_families, &rendering_families, &fixed_point_families}) {
         for (const family& f : *families) {
             known += std::string(" ") + f.name;
             bool wanted = o.families.empty();
             for (const std::string& name : o.families) wanted = wanted || name == f.name;
-            if (wanted) runs.push_back({&f, 0, 0, {}});
+            if (wanted) runs.push_back({&f, 0, 0, {}, {}});
         }
     }
     if (runs.size() < o.families.size() || runs.empty()) refuse("the families are:" + known);
@@ -104,6 +105,7 @@ void run_case(run_state* run, uint64_t seed) {
     random_source random(seed);
     const std::string difference = run->f->run(random, &run->seen);
     ++run->cases;
+    for (const auto& [what, times] : run->seen) run->first_case.emplace(what, seed);
     if (difference.empty()) return;
     std::printf("DIFFERENCE in family %s, case 0x%" PRIx64
                 ":\n  %s\nrepeat it: differential "
@@ -122,14 +124,19 @@ void run_for(run_state* run, const options& o, double seconds) {
     run->seconds += passed;
 }
 
+void print_seen(const run_state& run) {
+    for (const auto& [what, times] : run.seen) {
+        std::printf("%-16s %12" PRIu64 "  %s, first in case 0x%" PRIx64 "\n", "", times,
+                    what.c_str(), run.first_case.at(what));
+    }
+}
+
 void print_table(const std::vector<run_state>& runs) {
     std::printf("%-16s %12s %12s  %s\n", "family", "cases", "cases/s", "what");
     for (const run_state& run : runs) {
         std::printf("%-16s %12" PRIu64 " %12.0f  %s\n", run.f->name, run.cases,
                     static_cast<double>(run.cases) / run.seconds, run.f->what);
-        for (const auto& [what, times] : run.seen) {
-            std::printf("%-16s %12" PRIu64 "  %s\n", "", times, what.c_str());
-        }
+        print_seen(run);
     }
 }
 
@@ -141,6 +148,7 @@ int main(int count, char** arguments) {
     std::vector<run_state> runs = chosen_families(o);
     if (o.single) {
         run_case(&runs.front(), o.single_seed);
+        print_seen(runs.front());
         std::printf("no difference\n");
         return 0;
     }

@@ -18,7 +18,6 @@ public:
           photo(random_photo(r, width, height)),
           mask(random_mask(r, width, height)),
           model_mask(mask) {
-        model.supported_modes = {0};
         ze_destroy_objectsel();
         g_object_boundary = g_fill_boundary = {0, 0, 0, 0};
         g_Brush_Radius = 10;
@@ -79,7 +78,8 @@ public:
 
 private:
     std::string stroke() {
-        const int mode = random.one_in(12) ? random.any_of({-1, 6, 7, random.any_int()}) : 0;
+        const int mode =
+            random.one_in(12) ? random.any_of({-1, 6, 7, random.any_int()}) : random.between(0, 5);
         const int fill = random.one_in(8) ? random.any_of({2, -1, 256}) : random.between(0, 1);
         const int x1 = random.between(-1, width), y1 = random.between(-1, height);
         const int x2 = random.between(-1, width), y2 = random.between(-1, height);

@@ -2,6 +2,7 @@
 #include "tests/differential/family.h"
 #include "tests/differential/random_pictures.h"
 #include "tests/reference/engine_reference.h"
+#include "tests/reference/lasso_reference.h"
 
 namespace {
 
@@ -118,14 +119,85 @@ std::string run_grow(random_source& random, tally* seen) {
     return run_strokes(random, seen, &ER_selection::DoSelection, &reference::engine::DoSelection);
 }
 
+std::string run_shrink(random_source& random, tally* seen) {
+    return run_strokes(random, seen, &ER_selection::DeSelection, &reference::engine::DeSelection);
+}
+
 std::string run_tiny_grow(random_source& random, tally* seen) {
     return run_tiny_strokes(random, seen, &ER_selection::DoSelection,
                             &reference::engine::DoSelection);
+}
+
+std::string run_tiny_shrink(random_source& random, tally* seen) {
+    return run_tiny_strokes(random, seen, &ER_selection::DeSelection,
+                            &reference::engine::DeSelection);
+}
+
+// Calls for strokes that look at the mask alone.
+using mask_call = void (ER_selection::*)(unsigned char*, int, int, int, int, ze_rect*);
+using model_mask_call = void (reference::engine::*)(std::vector<unsigned char>&, int, int, int, int,
+                                                    reference::rect*);
+
+std::string run_painting(random_source& random, tally*) {
+    const bool adds = random.one_in(2);
+    const mask_call library_call = adds ? &ER_selection::Brush_Add : &ER_selection::Brush_Del;
+    const model_mask_call model_call =
+        adds ? &reference::engine::Brush_Add : &reference::engine::Brush_Del;
+    const int radius = random.size_up_to(31) - 1;
+    engine_pair engines(radius, random_core(random, radius));
+    const int width = random.size_up_to(100), height = random.size_up_to(100);
+    std::vector<unsigned char> mask = random_mask(random, width, height);
+    if (random.one_in(4)) sprinkle(random, &mask, 0, 255);
+    std::vector<unsigned char> model_mask = mask;
+    const int x = random.between(-radius - 2, width + radius + 2);
+    const int y = random.between(-radius - 2, height + radius + 2);
+    ze_rect changed = empty_beyond_image(width, height);
+    reference::rect expected = {width, 0, height, 0};
+    (engines.library.*library_call)(mask.data(), width, height, x, y, &changed);
+    (engines.model.*model_call)(model_mask, width, height, x, y, &expected);
+    if (expected != reference::rect{changed.left, changed.right, changed.top, changed.bottom}) {
+        return "another rectangle";
+    }
+    return first_difference("mask", mask, model_mask);
+}
+
+std::string run_lasso(random_source& random, tally*) {
+    const bool adds = random.one_in(2);
+    const int width = random.size_up_to(200), height = random.size_up_to(200);
+    std::vector<unsigned char> mask = random_mask(random, width, height);
+    if (random.one_in(4)) sprinkle(random, &mask, 0, 255);
+    std::vector<unsigned char> model_mask = mask;
+    ER_selection engine;
+    ze_rect changed = empty_beyond_image(width, height);
+    reference::rect expected = {width, 0, height, 0};
+    int x0 = random.between(0, width - 1), y0 = random.between(0, height - 1);
+    for (int segments = random.between(1, 5); segments > 0; --segments) {
+        const int margin = random.one_in(10) ? 2 : 0;
+        const int x1 = random.between(-margin, width - 1 + margin);
+        const int y1 = random.between(-margin, height - 1 + margin);
+        if (adds) {
+            engine.Lasso_Add(mask.data(), width, height, x0, y0, x1, y1, &changed);
+            reference::Lasso_Add(model_mask, width, height, x0, y0, x1, y1, &expected);
+        } else {
+            engine.Lasso_Del(mask.data(), width, height, x0, y0, x1, y1, &changed);
+            reference::Lasso_Del(model_mask, width, height, x0, y0, x1, y1, &expected);
+        }
+        x0 = x1;
+        y0 = y1;
+    }
+    if (expected != reference::rect{changed.left, changed.right, changed.top, changed.bottom}) {
+        return "another rectangle";
+    }
+    return first_difference("mask", mask, model_mask);
 }
 
 }  // namespace
 
 const std::vector<family> stroke_families = {
     {"grow", "growing strokes, radius 0 to 40, photos up to 200 x 200", run_grow},
+    {"shrink", "shrinking strokes, likewise", run_shrink},
     {"tiny-grow", "20 growing strokes each on tiny photos with walls", run_tiny_grow},
+    {"tiny-shrink", "20 shrinking strokes, likewise", run_tiny_shrink},
+    {"painting", "Brush_Add and Brush_Del", run_painting},
+    {"lasso", "segments of adding and removing lassos", run_lasso},
 };
