@@ -14,7 +14,7 @@ namespace {
 
 #define TO_TEXT(name) #name
 #define NAME_AS_TEXT(name) TO_TEXT(name)
-#define METHOD_NAME(result, name, arguments) NAME_AS_TEXT(UTIL_METHOD(name)),
+#define METHOD_NAME(result, name, ...) NAME_AS_TEXT(UTIL_METHOD(name)),
 
 const std::vector<std::string> METHOD_NAMES = {UTIL_METHODS(METHOD_NAME)};
 

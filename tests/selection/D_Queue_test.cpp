@@ -63,6 +63,32 @@ struct linked_queue {
     D_Queue q;
 };
 
+// Puts a queue's index into the middle of a longer array for as long as this object lives.
+class index_inside_an_array {
+public:
+    explicit index_inside_an_array(D_Queue* queue) : q(*queue), own(queue->index) {
+        q.index = array + MARGIN;
+    }
+    ~index_inside_an_array() { q.index = own; }
+    index_inside_an_array(const index_inside_an_array&) = delete;
+    index_inside_an_array& operator=(const index_inside_an_array&) = delete;
+
+    // Nothing has been written before or behind the index.
+    bool is_untouched() const {
+        for (int i = 0; i < MARGIN; ++i) {
+            if (array[i] || array[MARGIN + 100 + i]) return false;
+        }
+        return true;
+    }
+
+private:
+    static constexpr int MARGIN = 10;
+
+    D_Queue& q;
+    node** const own;
+    node* array[MARGIN + 100 + MARGIN] = {};
+};
+
 }  // namespace
 
 TEST(D_Queue, StartsEmptyWithBucketsOf100) {
@@ -353,6 +379,7 @@ TEST(D_Queue_push, ReportsABrokenListFoundThroughTheIndex) {
 TEST(D_Queue_push, OnlyCountsANodeWhenCountIsZeroAndThereIsAHead) {
     for (const int count : {0, -3}) {
         linked_queue f(1, {4, 6});
+        index_inside_an_array around(&f.q);
         f.q.count = count;
         node other = with_cost(0);
         node n = {0, 0, 5, 0, &other, &other};
@@ -366,6 +393,7 @@ TEST(D_Queue_push, OnlyCountsANodeWhenCountIsZeroAndThereIsAHead) {
         EXPECT_EQ(n.next, &other);
         // A count of 1 is a multiple of the step; one below 1 marks no position.
         EXPECT_EQ(f.q.index[0], count == 0 ? f[1] : nullptr);
+        EXPECT_TRUE(around.is_untouched());
     }
 }
 
@@ -388,6 +416,7 @@ TEST(D_Queue_push, MarksTheTailAlsoWhenTheNewNodeIsNotTheTail) {
 
 TEST(D_Queue_push, HasNoMarkBeyondThe100th) {
     filled_queue f(1);
+    index_inside_an_array around(&f.q);
     for (int i = 0; i < 105; ++i) f.push(i);
     for (size_t k = 0; k < 100; ++k) EXPECT_EQ(f.q.index[k], f[k]) << k;
 
@@ -398,6 +427,8 @@ TEST(D_Queue_push, HasNoMarkBeyondThe100th) {
     EXPECT_EQ(f.q.head, cheap);
     EXPECT_EQ(f.q.index[99], f[98]);
     EXPECT_EQ(f.q.count, 107);
+    f.q.pop();
+    EXPECT_TRUE(around.is_untouched());
 }
 
 // ---- pop

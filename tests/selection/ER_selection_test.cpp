@@ -68,7 +68,9 @@ TEST(ER_selection_initial, CountsTheCellsOfEachClass) {
 }
 
 TEST(ER_selection_initial, TiesTheQueuesStepToAHundredthOfTheCells) {
-    const struct { int radius, cells, step; } cases[] = {{5, 97, 1}, {10, 349, 3}, {20, 1313, 13}};
+    const struct {
+        int radius, cells, step;
+    } cases[] = {{5, 97, 1}, {10, 349, 3}, {19, 1201, 12}, {20, 1313, 13}, {22, 1597, 15}};
     for (const auto& c : cases) {
         const brush b(c.radius, 1);
         EXPECT_EQ(b.brush_cells, c.cells) << c.radius;

@@ -264,6 +264,18 @@ TEST(DoSelection, LeavesATieToTheFrontThatArrivedFirst) {
         .......)"));
 }
 
+TEST(DoSelection, VisitsNeighboursLeftRightUpDown) {
+    // With a core of one pixel and no rim seeds, the first five records tell.
+    engine e(3, 0);
+    Picture mask(7, 7, 1);
+    e.grow(FLAT, &mask, 3, 3);
+    const struct { int x, y; } order[] = {{3, 3}, {2, 3}, {4, 3}, {3, 2}, {3, 4}};
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_EQ(e.node_pool[i].x, order[i].x) << i;
+        EXPECT_EQ(e.node_pool[i].y, order[i].y) << i;
+    }
+}
+
 TEST(DoSelection, TakesAllItCanReachWithoutRimSeeds) {
     engine e(5);
     Picture mask(R"(
@@ -432,6 +444,20 @@ TEST(DoSelection, KeepsSelectedPixelsWhicheverFrontWinsThem) {
         .......)"));
 }
 
+TEST(DoSelection, GrowsThroughSelectedPixels) {
+    Picture mask(R"(
+        .......
+        .......
+        ..###..
+        ..###..
+        ..###..
+        .......
+        .......)");
+    engine e;
+    e.grow(DISC, &mask, 3, 3);
+    EXPECT_EQ(mask, GROWN_ON_DISC);
+}
+
 TEST(DoSelection, SeedsTheKeepFrontOnUnselectedRimPixelsOnly) {
     // With the rim selected at the bottom, the stroke's front is the only one to get there.
     Picture mask(R"(
@@ -494,6 +520,7 @@ TEST(DoSelection, ClearsForeignValuesInTheSquareAndIsBlockedByThem) {
         ..###...
         ........
         9.......)"));
+    EXPECT_EQ(e.nodes_used, 9 + 15 + 11);  // core, rim without the 5, inner without the 5
 }
 
 // ---- engine and queue
@@ -525,6 +552,8 @@ TEST(DoSelection, ForgetsCountAndIndexOfAnEarlierStroke) {
     e.grow(FLAT, &mask, 3, 3);
     EXPECT_EQ(mask, GROWN_ON_FLAT);
     EXPECT_EQ(e.nodes_used, 37);
+    EXPECT_EQ(e.queue->count, 0);
+    EXPECT_EQ(std::count(e.queue->index, e.queue->index + 100, &stale), 0);
 }
 
 TEST(DoSelection, PassesOverNodesThatLieOutsideTheImage) {
@@ -615,4 +644,164 @@ TEST(DoSelection, CommitsWhatIsWonWhenTheListBreaksWhileGrowing) {
     Picture third(7, 7, 0);
     EXPECT_EQ(e.grow(STEP_AT_THE_TOP, &third, 3, 3), (ze_rect{2, 4, 1, 4}));
     EXPECT_EQ(third, GROWN_ON_FLAT);
+}
+
+// ---- moving a queued node whose cost falls
+
+namespace {
+
+// A stroke of which everything is laid out by hand. The brush has no core; all inner pixels are
+// blocked but (3, 3) and its left neighbour, a step of 3 apart. `from` on the one and `lowered` on
+// the other are queued already, in a list of the test's own, when the stroke begins. Its seeds
+// reach nothing and only make the queue count; the first and the second are never linked (see
+// D_Queue::push).
+struct hand_made_stroke {
+    // Queues the nodes in this order.
+    void queue(const std::vector<node*>& nodes) {
+        for (size_t i = 1; i < nodes.size(); ++i) {
+            nodes[i - 1]->next = nodes[i];
+            nodes[i]->prev = nodes[i - 1];
+        }
+        e.queue->head = nodes.front();
+        e.queue->tail = nodes.back();
+    }
+
+    // REQUIRES: seeds <= 4.
+    void run(int seeds) {
+        Picture levels(7, 7, 0);
+        levels.at(2, 3) = 1;
+        const struct { int x, y; } rim[] = {{2, 6}, {3, 6}, {4, 6}, {5, 5}};
+        for (int i = 0; i < seeds; ++i) mask.at(rim[i].x, rim[i].y) = 0;
+        e.node_map[brush_cell(e, -1, 0)] = &lowered;
+        e.grow(levels, &mask, 3, 3);
+    }
+
+    engine e{3, -1};
+    Picture mask{R"(
+        ..###..
+        .#555#.
+        #55555#
+        #5..55#
+        #55555#
+        .#555#.
+        ..###..)"};
+    node from = {3, 3, 0, 1, nullptr, nullptr};
+    node lowered = {2, 3, 100, 0, nullptr, nullptr};
+    node a = {-1, -1, 0, 0, nullptr, nullptr};  // outside the image: popped, it does nothing
+    node b = {-1, -1, 200, 0, nullptr, nullptr};
+};
+
+}  // namespace
+
+TEST(DoSelection, GivesALoweredNodeTheCostAndLabelOfItsNewPath) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.lowered});
+    s.run(1);
+    EXPECT_EQ(s.lowered.cost, 3);
+    EXPECT_EQ(s.lowered.label, 1);
+    EXPECT_EQ(s.mask.at(3, 3), 1);
+
+    hand_made_stroke tie;
+    tie.lowered.cost = 3;
+    tie.queue({&tie.from, &tie.lowered});
+    tie.run(1);
+    EXPECT_EQ(tie.lowered.cost, 3);
+    EXPECT_EQ(tie.lowered.label, 0);
+    EXPECT_EQ(tie.e.queue->tail, &tie.lowered);
+}
+
+// In the next three, the one seed's count is used up by the first pop. The push that follows the
+// unlinking then only counts, and what the unlinking did can be seen.
+
+TEST(DoSelection, UnlinksTheTail) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.a, &s.lowered});
+    s.run(1);
+    EXPECT_EQ(s.e.queue->tail, &s.a);
+    EXPECT_EQ(s.a.next, nullptr);
+    EXPECT_EQ(s.e.queue->head, &s.a);
+    EXPECT_EQ(s.e.queue->count, 0);
+
+    hand_made_stroke alone;
+    alone.queue({&alone.from, &alone.lowered});
+    alone.run(1);
+    EXPECT_EQ(alone.e.queue->tail, nullptr);
+    EXPECT_EQ(alone.e.queue->head, &alone.lowered);
+}
+
+TEST(DoSelection, UnlinksTheHeadAndLeavesThePrevOfTheNextOne) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.lowered, &s.a, &s.b});
+    s.run(1);
+    EXPECT_EQ(s.e.queue->head, &s.a);
+    EXPECT_EQ(s.a.prev, &s.lowered);
+    EXPECT_EQ(s.e.queue->tail, &s.b);
+    EXPECT_EQ(s.e.queue->count, 0);
+}
+
+TEST(DoSelection, UnlinksFromTheMiddle) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.a, &s.lowered, &s.b});
+    s.run(1);
+    EXPECT_EQ(s.a.next, &s.b);
+    EXPECT_EQ(s.b.prev, &s.a);
+    EXPECT_EQ(s.e.queue->head, &s.a);
+    EXPECT_EQ(s.e.queue->tail, &s.b);
+    EXPECT_EQ(s.e.queue->count, 0);
+}
+
+TEST(DoSelection, LeavesALoweredNodeInItsPlaceWhenCountIsOne) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.a, &s.lowered});
+    s.run(2);  // a count of 1 is left after the first pop, none after that of `a`
+    EXPECT_EQ(s.lowered.cost, 3);
+    EXPECT_EQ(s.lowered.label, 1);
+    EXPECT_EQ(s.a.next, &s.lowered);
+    EXPECT_EQ(s.e.queue->head, &s.lowered);
+    EXPECT_EQ(s.e.queue->tail, &s.lowered);
+    EXPECT_EQ(s.mask.at(2, 3), 0);
+}
+
+TEST(DoSelection, DoesNotTellTheIndexThatANodeMoves) {
+    hand_made_stroke s;
+    s.queue({&s.from, &s.a, &s.lowered, &s.b});
+    s.e.queue->tail = &s.a;  // marked by the seed, and moved on to `lowered` by the pop
+    s.run(1);
+    EXPECT_EQ(s.a.next, &s.b);
+    EXPECT_EQ(s.e.queue->index[0], &s.lowered);
+}
+
+TEST(DoSelection, EndsTheGrowthWhenALoweredNodeFindsTheListBroken) {
+    // Two seeds go before `a`; `lowered` would go before `dear`, which has no `prev`. `open` would
+    // be won next.
+    hand_made_stroke s;
+    s.mask.at(3, 1) = 0;
+    s.from.cost = -1;
+    node open = {3, 1, -1, 1, nullptr, nullptr};
+    node dear = {-1, -1, 5, 0, nullptr, nullptr};
+    s.queue({&s.from, &open, &s.a, &dear, &s.lowered});
+    dear.prev = nullptr;
+    s.run(4);
+    EXPECT_EQ(s.lowered.cost, 2);
+    EXPECT_EQ(s.e.queue->head, &open);
+    EXPECT_EQ(s.e.queue->count, 2);
+    EXPECT_EQ(s.mask.at(3, 3), 1);
+    EXPECT_EQ(s.mask.at(3, 1), 0);
+    EXPECT_TRUE(s.e.node_map_is_empty());
+}
+
+TEST(DoSelection, KeepsToThePoppedPixelWhenItsRecordIsHandedOutAnew) {
+    // A record that an earlier stroke left queued, and which this one hands out second, for the
+    // popped pixel's left neighbour.
+    engine e(3, -1);
+    e.node_pool[1] = {3, 3, 0, 1, nullptr, nullptr};
+    e.queue->head = e.queue->tail = &e.node_pool[1];
+    Picture mask(7, 7, 1);
+    mask.at(3, 6) = 0;  // the only seed
+    e.grow(FLAT, &mask, 3, 3);
+    const struct { int x, y; } order[] = {{3, 6}, {2, 3}, {4, 3}, {3, 2}, {3, 4}};
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_EQ(e.node_pool[i].x, order[i].x) << i;
+        EXPECT_EQ(e.node_pool[i].y, order[i].y) << i;
+    }
 }

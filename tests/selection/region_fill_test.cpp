@@ -199,14 +199,14 @@ TEST(Fill_Region, LeavesNoTwoInsideTheBox) {
 }
 
 TEST(Fill_Region, TakesOtherValuesForBackground) {
-    expect_unchanged(Picture(R"(
-        33333
-        3...3
-        44444)"));
-    expect_unchanged(Picture(R"(
-        #####
-        #...#
-        ##5##)"));
+    for (const int value : {0, 3, 4, 5, 6, 33, 255}) {
+        Picture drawing(R"(
+            #####
+            #...#
+            ##.##)");
+        drawing.at(2, 2) = static_cast<unsigned char>(value);
+        expect_unchanged(drawing);
+    }
 }
 
 TEST(Fill_Region, ChangesNothingWithoutAWorkBuffer) {
