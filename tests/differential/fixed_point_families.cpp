@@ -32,10 +32,14 @@ double random_double(random_source& random) {
                                   -2.5, 2147483647.5, -2147483648.5, 1e300, -1e300, 1e-310,
                                   std::numeric_limits<double>::infinity(),
                                   -std::numeric_limits<double>::infinity(), std::nan("")});
-        case 1:
-            return random_fixed(random) / 65536.0 + random.between(-2, 2) / 131072.0;
-        default:
-            return static_cast<double>(random.any_int()) / random.between(1, 70000);
+        case 1: {
+            const double near = random_fixed(random) / 65536.0;
+            return near + random.between(-2, 2) / 131072.0;
+        }
+        default: {
+            const double numerator = random.any_int();
+            return numerator / random.between(1, 70000);
+        }
     }
 }
 

@@ -78,7 +78,8 @@ void draw_comb(random_source& random, canvas& mask) {
     const int spine = random.between(0, mask.height - 1);
     mask.rectangle(0, mask.width - 1, spine, spine);
     for (int x = random.between(0, 3); x < mask.width; x += pitch) {
-        mask.rectangle(x, x, spine - random.between(0, 9), spine + random.between(0, 9));
+        const int top = spine - random.between(0, 9);
+        mask.rectangle(x, x, top, spine + random.between(0, 9));
     }
 }
 
@@ -97,8 +98,9 @@ void draw_rectangles(random_source& random, canvas& mask) {
     for (int count = random.between(1, 6); count > 0; --count) {
         const int left = random.between(-5, mask.width);
         const int top = random.between(-5, mask.height);
-        mask.rectangle(left, left + random.size_up_to(60), top, top + random.size_up_to(60),
-                       random.one_in(3) ? 0 : 1);
+        const int right = left + random.size_up_to(60);
+        const int bottom = top + random.size_up_to(60);
+        mask.rectangle(left, right, top, bottom, random.one_in(3) ? 0 : 1);
     }
 }
 

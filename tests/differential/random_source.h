@@ -1,4 +1,6 @@
-// Random numbers that are the same on every machine: a case is replayed from its seed alone.
+// Random numbers that are the same on every machine: a case is replayed from its seed alone. For
+// that, draw no two numbers in the arguments of one call or around one operator, whose order C++
+// leaves open; in braces it is fixed.
 #pragma once
 
 #include <cstddef>

@@ -27,6 +27,10 @@ struct scene {
     std::vector<unsigned char> model_mask;
 };
 
+struct position {
+    int x, y;
+};
+
 // An engine of the library and one of the model.
 struct engine_pair {
     engine_pair(int radius, int core) {
@@ -34,13 +38,14 @@ struct engine_pair {
         model.initial(radius, core);
     }
 
-    std::string stroke_at(scene* s, int x, int y, stroke library_stroke,
+    std::string stroke_at(scene* s, const position& at, stroke library_stroke,
                           model_stroke stroke_of_model) {
         ze_rect changed = empty_beyond_image(s->width, s->height);
         reference::rect expected = {s->width, 0, s->height, 0};
-        (library.*library_stroke)(s->photo.data(), s->mask.data(), s->width, s->height, x, y,
+        (library.*library_stroke)(s->photo.data(), s->mask.data(), s->width, s->height, at.x, at.y,
                                   &changed);
-        (model.*stroke_of_model)(s->photo, s->model_mask, s->width, s->height, x, y, &expected);
+        (model.*stroke_of_model)(s->photo, s->model_mask, s->width, s->height, at.x, at.y,
+                                 &expected);
         const reference::rect found = {changed.left, changed.right, changed.top, changed.bottom};
         if (found != expected) return "another rectangle";
         if (library.nodes_used != model.nodes_used) return "another number of nodes";
@@ -76,16 +81,16 @@ std::string run_strokes(random_source& random, tally* seen, stroke library_strok
                         model_stroke stroke_of_model) {
     const int radius = random.size_up_to(41) - 1;
     engine_pair engines(radius, random_core(random, radius));
-    scene s(random, random.size_up_to(200), random.size_up_to(200));
+    scene s{random, random.size_up_to(200), random.size_up_to(200)};
     for (int strokes = random.between(1, 4); strokes > 0; --strokes) {
-        if (random.one_in(8)) s = scene(random, random.size_up_to(200), random.size_up_to(200));
+        if (random.one_in(8)) s = scene{random, random.size_up_to(200), random.size_up_to(200)};
         if (random.one_in(8)) {
             sprinkle(random, &s.mask, 0, 255);
             s.model_mask = s.mask;
         }
-        std::string difference =
-            engines.stroke_at(&s, random.between(-2, s.width + 1), random.between(-2, s.height + 1),
-                              library_stroke, stroke_of_model);
+        std::string difference = engines.stroke_at(
+            &s, {random.between(-2, s.width + 1), random.between(-2, s.height + 1)}, library_stroke,
+            stroke_of_model);
         if (!difference.empty()) return difference;
     }
     engines.count_what_happened(seen);
@@ -98,7 +103,7 @@ std::string run_tiny_strokes(random_source& random, tally* seen, stroke library_
                              model_stroke stroke_of_model) {
     const int radius = random.between(2, 8);
     engine_pair engines(radius, random.between(0, 2));
-    scene s(random, random.between(3, 24), random.between(3, 24));
+    scene s{random, random.between(3, 24), random.between(3, 24)};
     for (int strokes = 0; strokes < 20; ++strokes) {
         (*seen)["strokes"]++;
         if (random.one_in(4)) {
@@ -107,7 +112,7 @@ std::string run_tiny_strokes(random_source& random, tally* seen, stroke library_
             s.model_mask = s.mask;
         }
         std::string difference =
-            engines.stroke_at(&s, random.between(0, s.width - 1), random.between(0, s.height - 1),
+            engines.stroke_at(&s, {random.between(0, s.width - 1), random.between(0, s.height - 1)},
                               library_stroke, stroke_of_model);
         if (!difference.empty()) return difference;
     }

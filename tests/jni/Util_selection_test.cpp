@@ -188,6 +188,25 @@ TEST_P(Util_selection_arrays, ModifyPassesTheMode) {
     EXPECT_EQ(picture_of(mask, 6, 5), Picture(6, 5, 0));
 }
 
+// A lasso segment from the first point to the second.
+TEST_P(Util_selection_arrays, ModifyPassesBothPoints) {
+    ze_set_brush_size(1, 0);
+    fake_ints pixels("pixels", Pixels(6, 5, 'a').cells);
+    fake_bytes mask("mask", Picture(6, 5, 0).cells);
+    fake_point p1("p1", 4, 1), p2("p2", 1, 2);
+    fake_rect rect("rect", {0, 0, 0, 0});
+
+    UTIL_METHOD(modify_1objectsel)(&env, nullptr, pixels, mask, 6, 5, p1, p2, 4, rect, 0);
+
+    EXPECT_EQ(picture_of(mask, 6, 5), Picture(R"(
+        ......
+        ...##.
+        .##...
+        ......
+        ......)"));
+    EXPECT_EQ(rect.value(), (ze_rect{1, 4, 1, 2}));
+}
+
 TEST_P(Util_selection_arrays, ModifyPassesFill) {
     const Picture ring(R"(
         .......
