@@ -24,6 +24,6 @@ void draw_small_image(const view_pixels& view, const photo_pixels& photo, const 
 // rows 0 .. rows - 1, as draw_image samples them but not clamped to the photo. A negative count
 // writes nothing of its kind; rows then keep their place, and those before points[0] are left out.
 //
-// REQUIRES: columns + rows elements.
+// REQUIRES: room for the columns, and for the rows behind them.
 void set_image_points(int columns, int rows, float scale, int offset_x, int offset_y,
                       int32_t* points);

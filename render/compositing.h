@@ -1,7 +1,7 @@
 // Pictures of a photo and its selection, as tall and wide as the photo.
 //
 //   src, dst  pixels 0xAARRGGBB, rows `width` apart; both may be the same buffer
-//   mask      one byte per pixel; 1 is selected, any other value is not
+//   mask      one byte per pixel, unless a function says otherwise; 1 is selected, others are not
 //
 // The grey of a pixel keeps its alpha and has (red + green + blue) / 3, rounded down, in all three
 // channels. Pointers, lengths and rectangles are not checked.

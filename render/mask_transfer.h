@@ -19,13 +19,15 @@ extern "C" {
 //   left .. bottom  inclusive rectangle of the small mask
 //   flag          0 adds: edge blocks only gain 1s; any other value removes: they only gain 0s
 //
-// The seventh argument is not read. REQUIRES: the rectangle lies in the small mask; every block,
-// and one column and row beyond it, lies in the photo.
+// The seventh argument is not read. REQUIRES: the rectangle lies in the small mask; every block
+// lies in the photo, and of an edge block one column and row beyond it too.
 //
-// Deliberate: mask bytes are compared whole, so foreign values are neither 0 nor 1. Block positions
-// are single-precision quotients, and positions beyond a row reach into the next. On the small
-// mask's last row and column only values equal to 1 - flag are copied. A uniform block is
-// overwritten whatever the flag.
+// Deliberate:
+// - Mask bytes are compared whole. Foreign values count as selected when adding; when removing, a
+//   block under one stays as it is.
+// - Block positions are single-precision quotients, and positions beyond a row reach into the next.
+// - On the small mask's last row and column only values equal to 1 - flag are copied.
+// - A uniform block is overwritten whatever the flag.
 ZE_API void ze_modify_mask(unsigned char* small_mask, unsigned char* large_mask,
                            uint32_t* large_image, int small_width, int small_height,
                            int large_width, int, float ratio, int left, int right, int top,

@@ -108,10 +108,10 @@ void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height
 void ze_inverse_mask(unsigned char* mask, int width, int height) {
     g_object_boundary = empty_at_last_pixel(width, height);
     for (int y = 0; y < height; ++y) {
-        unsigned char* const row = mask + ptrdiff_t{y} * width;
         for (int x = 0; x < width; ++x) {
-            row[x] = row[x] != 1;
-            if (row[x] == 1) include(&g_object_boundary, x, y);
+            unsigned char& pixel = mask[ptrdiff_t{y} * width + x];
+            pixel = pixel != 1;
+            if (pixel == 1) include(&g_object_boundary, x, y);
         }
     }
 }
@@ -124,9 +124,8 @@ void ze_update_objectROI(unsigned char* mask, int width, int height) {
     const ze_rect old = clip_to_image(g_object_boundary, width, height);
     g_object_boundary = empty_beyond_image(width, height);
     for (int y = old.top; y <= old.bottom; ++y) {
-        const unsigned char* const row = mask + ptrdiff_t{y} * width;
         for (int x = old.left; x <= old.right; ++x) {
-            if (row[x] == 1) include(&g_object_boundary, x, y);
+            if (mask[ptrdiff_t{y} * width + x] == 1) include(&g_object_boundary, x, y);
         }
     }
 }
