@@ -36,8 +36,9 @@ import android.graphics.Rect;
  * number of strokes with {@link #modify_objectsel}, {@link #destroy_objectsel}.
  *
  * <p>Call the session's methods from one thread at a time. The methods whose names begin with
- * {@code native_} share nothing and may run on any thread, as long as no two write to the same
- * array.
+ * {@code native_} share nothing and may run on any thread, as long as no two are handed the same
+ * array. Deliberate: every array is written back at the end of a call, also one that was only read,
+ * so what another thread put into it meanwhile may be lost.
  *
  * <h2>Bad input</h2>
  *
@@ -57,7 +58,8 @@ public final class Util {
 
     /**
      * Begins the selection on a photo: builds a new engine for the current brush and empties the
-     * object box.
+     * object box ({@code left} = width - 1, {@code right} = 0, {@code top} = height - 1,
+     * {@code bottom} = 0).
      *
      * <p>The mask is the caller's and is not touched; see {@link #reset_objectsel}. An engine that
      * exists is released first. The new engine is built for a brush, not for a size: every stroke
@@ -80,32 +82,36 @@ public final class Util {
      *       <th>then, with {@code fill} 1</th></tr>
      *   <tr><td>0 grow</td><td>selects from the brush's core outwards, up to edges of
      *       colour inside the brush</td><td>holes of the selection are filled</td></tr>
-     *   <tr><td>1 shrink</td><td>the same with deselecting</td><td>pieces that were cut off are
-     *       erased and the object box is rebuilt</td></tr>
+     *   <tr><td>1 shrink</td><td>the same with deselecting</td><td>of several pieces the largest
+     *       stays, the others are erased; the object box is rebuilt</td></tr>
      *   <tr><td>2 paint</td><td>selects the brush's disc</td><td>holes of the selection are
      *       filled</td></tr>
      *   <tr><td>3 erase</td><td>deselects the brush's disc</td><td>nothing</td></tr>
      *   <tr><td>4 lasso, adding</td><td>draws an outline from {@code p1} to {@code p2}: 0 becomes
-     *       1, any other value 5</td><td>what outline and selection enclose is selected; outline
-     *       values become 1</td></tr>
+     *       1, any other value 5</td><td>what outline and selection enclose is selected; 5
+     *       becomes 1</td></tr>
      *   <tr><td>5 lasso, removing</td><td>draws an outline from {@code p1} to {@code p2}: 1
      *       becomes 4, any other value 3</td><td>what the outline encloses is deselected, the
      *       outline too</td></tr>
      * </table>
      *
-     * <p>Modes 0, 2, 4 and 5 widen the object box by what the operation itself changed; 1 and 3
+     * <p>Modes 0, 2, 4 and 5 widen the object box by the rectangle of the operation itself; 1 and 3
      * leave it, apart from the rebuilding named above. The passes with {@code fill} look only
-     * inside the object box.
+     * inside the object box; they run also after an operation that changed nothing.
      *
-     * <p>Points: modes 0 and 1 do nothing at a point on or beyond the outermost rows and columns of
-     * the photo. Modes 2 and 3 paint that part of the disc that lies on the photo. A lasso segment
-     * with an end outside the photo is not drawn.
+     * <p>Points: mode 0 does nothing at a point on or beyond the outermost rows and columns of the
+     * photo. Mode 1 has no such margin; it does nothing at a point outside the photo or where the
+     * mask is not 1. Modes 2 and 3 paint that part of the disc that lies on the photo. A lasso
+     * segment with an end outside the photo is not drawn.
      *
      * <p>Deliberate: without an engine, and for an unknown mode, {@code rect} is emptied and
      * nothing else happens. Modes 2 and 3 leave out the last row and the last column of the brush's
-     * square. Mode 5 widens the object box although it removes pixels. With {@code fill} 0, outline
-     * values 3, 4 and 5 stay in the mask, so a lasso of several segments passes 0 until its last
-     * one.
+     * square, so a brush of radius 0 paints nothing. Mode 5 widens the object box although it
+     * removes pixels. With {@code fill} 0, outline values 3, 4 and 5 stay in the mask, so a lasso
+     * of several segments passes 0 until its last one. Brushes treat such values each in their way:
+     * mode 0 makes 4 selected and clears the others in the brush's square, mode 1 makes 3 selected
+     * and clears 4 there and each 5 that it reaches, modes 2 and 3 leave them. Mode 1's pass
+     * measures a piece by the pixels inside its contour and keeps the later one of two equals.
      *
      * @param pixels the photo, read by modes 0 and 1; never changed, though written back as it was
      * @param mask the selection, changed
@@ -116,10 +122,11 @@ public final class Util {
      *     fields are read and not used
      * @param mode 0 to 5, see the table
      * @param rect receives the rectangle changed by the call, its former fields do not matter:
-     *     around the pixels that the operation selected, removed or drew, and with modes 0 and 2
-     *     the filled ones; {@code left} = width, {@code right} = 0, {@code top} = height,
-     *     {@code bottom} = 0 when there are none. Deliberate: mode 0 counts pixels of the brush's
-     *     square that were selected before as well.
+     *     around the pixels that the operation selected, removed or drew, and with modes 0, 1 and 2
+     *     also those that the pass filled or erased; {@code left} = width, {@code right} = 0,
+     *     {@code top} = height, {@code bottom} = 0 when there are none. Deliberate: mode 0 counts
+     *     pixels of the brush's square that were selected before as well, and mode 1 unselected
+     *     ones that it reached; what a lasso's pass changes is not counted.
      * @param fill 1 runs the pass of the mode's last column; any other value, also 2 or -1, does
      *     not
      */
@@ -167,9 +174,10 @@ public final class Util {
      * nothing.
      *
      * @param radius radius of the brush in photo pixels; before the first call it is 10
-     * @param center radius of the core, whose pixels a stroke always takes, in photo pixels; before
-     *     the first call it is 1. From {@code radius} on, growing and shrinking have no room
-     *     between core and rim.
+     * @param center radius of the core, whose pixels a growing or shrinking stroke always takes, in
+     *     photo pixels; before the first call it is 1. From {@code radius} - 1 on, growing and
+     *     shrinking have no room between core and rim; beyond {@code radius} the core goes on
+     *     outside the rim.
      */
     public static native void set_brush_size(int radius, int center);
 
@@ -203,8 +211,8 @@ public final class Util {
     /**
      * Reads the object box.
      *
-     * @param roi receives the four values as they stand, empty forms included; all 0 before the
-     *     first {@link #init_objectsel}
+     * @param roi receives the four values as they stand, empty forms included; all 0 until a
+     *     method first sets them
      */
     public static native void get_objectROI(Rect roi);
 
@@ -212,7 +220,7 @@ public final class Util {
      * Sets the object box.
      *
      * <p>Deliberate: the values are stored as they are, also a {@code left} beyond {@code right} or
-     * a box larger than the photo. Whoever uses it takes the part that lies on the photo.
+     * a box larger than the photo. What looks inside it takes the part that lies on the photo.
      *
      * @param roi the new box
      */
@@ -337,10 +345,10 @@ public final class Util {
      *
      * <p>Deliberate: photo positions are rounded to nearest, while {@link #native_drawImage} rounds
      * down. In the first and last row and column of {@code rect} every pixel of value 1 or 3 takes
-     * the outline's colour. Selected pixels on the photo's own border show the photo. With
-     * {@code top} beyond {@code bottom} these two rows are drawn all the same (when {@code left} is
-     * not beyond {@code right}); with {@code left} beyond {@code right} these two columns of the
-     * rows between.
+     * the outline's colour. Elsewhere selected pixels on the photo's own border show the photo.
+     * With {@code top} beyond {@code bottom} these two rows are drawn all the same (when
+     * {@code left} is not beyond {@code right}); with {@code left} beyond {@code right} these two
+     * columns of the rows between.
      *
      * @param view receives the picture
      * @param viewWidth width of the view

@@ -54,6 +54,63 @@ class PlayerTest {
                         + "                      5  5..20 x 6..9"), run.out().subList(0, 3));
     }
 
+    /** Each command on a selection of nothing, and again on one of all 1200 pixels. */
+    @ParameterizedTest
+    @CsvSource({
+        "'grow 10,10', 1, 1200",
+        "'shrink 10,10', 0, 1199",
+        "'paint 10,10', 4, 1200",
+        "'erase 10,10', 0, 1196",
+        "'lasso add 8,8 10,8 10,10 8,10', 9, 1200",
+        "'lasso remove 8,8 10,8 10,10 8,10', 0, 1191"})
+    void eachCommandIsAModeOfItsOwn(String line, String ofNone, String ofAll) throws IOException {
+        PlayerRun none = play("photo photo.png", "brush 1 1", line);
+        assertEquals(ofNone, selectedIn(lastRow(none)));
+        PlayerRun all = play("photo photo.png", "brush 1 1", "invert", line);
+        assertEquals(ofAll, selectedIn(lastRow(all)));
+    }
+
+    @Test
+    void lassoPrintsItsCornersItsOutlineAndTheObjectBox() throws IOException {
+        PlayerRun run = play("photo photo.png", "lasso add 5,6 9,6 9,10", "invert",
+                "lasso remove 20,20 30,20 25,25");
+        assertEquals("2 lasso add 5,6 .. 9,10 (3 corners) 5..9 x 6..10 15 5..9 x 6..10",
+                squeezed(run.out()).get(1));
+        assertEquals("4 lasso remove 20,20 .. 25,25 (3 corners) 20..30 x 20..25 1149"
+                + " 0..39 x 0..29", squeezed(run.out()).get(3));
+    }
+
+    @Test
+    void lassoWithFillOffIsFilledByALaterOne() throws IOException {
+        PlayerRun run = play("photo photo.png", "fill off", "lasso add 5,6 9,6 9,10", "fill on",
+                "lasso add 20,20 20,20 20,20");
+        // Of twelve outline pixels the three corners hold 5, which does not count as selected.
+        assertTrue(squeezed(run.out()).get(1).contains(" 9 5..9 x 6..10"), run.out().get(1));
+        assertTrue(squeezed(run.out()).get(2).contains(" 16 5..20 x 6..20"), run.out().get(2));
+    }
+
+    @Test
+    void shrinkingWithFillErasesTheSmallerPieceAndTheBoxFollows() throws IOException {
+        String[] lines = {"photo photo.png", "brush 4 3", "", "paint 8,10 to 30,10",
+            "shrink 14,7 14,11"};
+        lines[2] = "fill on";
+        assertEquals("5 shrink 14,7 .. 14,11 (2 dabs) 4..17 x 4..14 129 17..33 x 6..13",
+                squeezed(play(lines).out()).get(2));
+        lines[2] = "fill off";
+        assertEquals("5 shrink 14,7 .. 14,11 (2 dabs) 11..17 x 4..14 183 4..33 x 6..13",
+                squeezed(play(lines).out()).get(2));
+    }
+
+    @Test
+    void largestAndSmallestBrushesArePlayed() throws IOException {
+        PlayerRun run = play("photo photo.png", "brush 500 500", "paint 20,15", "brush 0 0",
+                "erase 20,15", "shrink 20,15");
+        assertEquals(List.of("3 paint 20,15 (1 dab) 0..39 x 0..29 1200 0..39 x 0..29",
+                "5 erase 20,15 (1 dab) none 1200 0..39 x 0..29"),
+                squeezed(run.out()).subList(1, 3));
+        assertEquals(0, run.status());
+    }
+
     @Test
     void strokeThatChangesNothingSaysSo() throws IOException {
         PlayerRun run = play("photo photo.png", "grow 0,0");
@@ -345,6 +402,11 @@ class PlayerTest {
 
     private static String lastRow(PlayerRun run) {
         return run.out().get(run.out().size() - 2);
+    }
+
+    /** The count of selected pixels: the number before the object box. */
+    private static String selectedIn(String row) {
+        return row.replaceAll("(none|\\S+ x \\S+)$", "").strip().replaceAll(".* ", "");
     }
 
     private static String lastOf(List<String> lines) {

@@ -6,6 +6,8 @@ import java.io.IOException;
 import java.nio.file.Files;
 import java.nio.file.Path;
 import java.util.List;
+import java.util.stream.Stream;
+import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
 import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.ValueSource;
@@ -18,8 +20,9 @@ class ReplayTest {
     private Path folder;
 
     @ParameterizedTest
-    @ValueSource(strings = {"fig", "dandelion"})
-    void scriptEndsWithItsDigest(String name) throws IOException, InterruptedException {
+    @ValueSource(strings = {"fig", "dandelion", "lasso", "torture"})
+    void scriptEndsWithItsDigest(String name)
+            throws IOException, ScriptException, InterruptedException {
         String expected = Files.readString(DESKTOP.resolve("scripts/" + name + ".digest")).strip();
         Path script = beside(name);
 
@@ -30,21 +33,33 @@ class ReplayTest {
         assertEquals(0, run.status());
     }
 
+    @Test
+    void everyScriptIsReplayed() throws IOException {
+        try (Stream<Path> files = Files.list(DESKTOP.resolve("scripts"))) {
+            assertEquals(List.of("dandelion", "fig", "lasso", "torture"),
+                    files.map(file -> file.getFileName().toString())
+                            .filter(file -> file.endsWith(".strokes"))
+                            .map(file -> file.replace(".strokes", "")).sorted().toList());
+        }
+    }
+
     /**
      * Copies a script beside a folder of photos in which its photo is stored as PNG; the name stays
      * as the script has it, since files are recognised by their content.
      */
-    private Path beside(String name) throws IOException, InterruptedException {
-        String fileName = "photos/" + name + ".jpg";
-        Files.createDirectories(folder.resolve("photos"));
-        ChildJvm conversion = ChildJvm.run(folder, JpegToPng.class,
-                DESKTOP.resolve(fileName).toString(), folder.resolve(fileName).toString());
-        assertEquals("", conversion.err());
-        assertEquals(0, conversion.status());
-
+    private Path beside(String name) throws IOException, ScriptException, InterruptedException {
         Path scripts = Files.createDirectories(folder.resolve("scripts"));
         String scriptName = name + ".strokes";
-        return Files.copy(DESKTOP.resolve("scripts").resolve(scriptName),
+        Path script = Files.copy(DESKTOP.resolve("scripts").resolve(scriptName),
                 scripts.resolve(scriptName));
+
+        String photo = ScriptParser.parse(Files.readAllBytes(script)).photo();
+        Path copy = scripts.resolve(photo).normalize();
+        Files.createDirectories(copy.getParent());
+        ChildJvm conversion = ChildJvm.run(folder, JpegToPng.class,
+                DESKTOP.resolve("scripts").resolve(photo).toString(), copy.toString());
+        assertEquals("", conversion.err());
+        assertEquals(0, conversion.status());
+        return script;
     }
 }

@@ -39,6 +39,9 @@ class ScriptParserTest {
     @Test
     void brushAndFill() throws ScriptException {
         assertEquals(new Command.Brush(2, 28, 4), command("brush 28 4"));
+        assertEquals(new Command.Brush(2, 0, 0), command("brush 0 0"));
+        assertEquals(new Command.Brush(2, 0, 500), command("brush 0 500"));
+        assertEquals(new Command.Brush(2, 500, 0), command("brush 500 0"));
         assertEquals(new Command.Fill(2, true), command("fill on"));
         assertEquals(new Command.Fill(2, false), command("fill off"));
     }
@@ -59,6 +62,14 @@ class ScriptParserTest {
         List<Point> corners = List.of(new Point(1, 2), new Point(3, 4), new Point(5, 6));
         assertEquals(new Command.Lasso(2, mode, corners),
                 command("lasso " + word + " 1,2 3,4 5,6"));
+    }
+
+    @Test
+    void pointsMayStandAnywhereAndAlsoTwice() throws ScriptException {
+        List<Point> corners = List.of(new Point(-1, 2), new Point(32767, 4), new Point(-1, 2),
+                new Point(-1, 2));
+        assertEquals(new Command.Lasso(2, Mode.LASSO_ADD, corners),
+                command("lasso add -1,2 32767,4 -1,2 -1,2"));
     }
 
     @ParameterizedTest
@@ -108,10 +119,18 @@ class ScriptParserTest {
         "brush 4 1 1       | `\"1\" is one word too many, expected brush RADIUS CORE`",
         "fill              | `the line ends too early, expected on or off`",
         "fill yes          | `\"yes\" is out of place, expected on or off`",
+        "brush 4 501       | `\"501\" is out of place, expected the radius of the brush's core,"
+                + " a whole number from 0 to 500`",
+        "fill on off       | `\"off\" is one word too many, expected fill on|off`",
         "grow              | `the line ends too early, expected a point X,Y such as 120,45`",
         "grow 1;2          | `\"1;2\" is no point, expected a point X,Y such as 120,45`",
         "grow 1,2 to       | `the line ends too early, expected a point X,Y such as 120,45`",
         "grow to 1,2       | `\"to\" is no point, expected a point X,Y such as 120,45`",
+        "shrink            | `the line ends too early, expected a point X,Y such as 120,45`",
+        "paint 1,2 to to   | `\"to\" is no point, expected a point X,Y such as 120,45`",
+        "erase 1,2,3       | `\"1,2,3\" is no point, expected a point X,Y such as 120,45`",
+        "lasso             | `the line ends too early, expected add or remove`",
+        "lasso remove 1,2 3,4 5,6 x | `\"x\" is no point, expected a point X,Y such as 120,45`",
         "lasso 1,2         | `\"1,2\" is out of place, expected add or remove`",
         "lasso add 1,2 3,4 | `the line ends too early, expected a point X,Y such as 120,45`",
         "lasso add 1,2 to 3,4 | `\"to\" is no point, expected a point X,Y such as 120,45`",
