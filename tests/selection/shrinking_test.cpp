@@ -310,6 +310,42 @@ TEST(DeSelection, PricesNoCellInTheImagesFirstRowAndColumn) {
     EXPECT_EQ(costs(b.cost_v), priced);
 }
 
+TEST(DeSelection, StepsAlongTheImagesEdgeAtTheCostsOfEarlierStrokes) {
+    // Of the bar in the first row, the core's colour is nearer than that of the one rim pixel that
+    // seeds the keep front, at (2, 0).
+    const Pixels photo(R"(
+        zzzbbbzzz
+        zzzccczzz
+        zzzccczzz
+        zzzccczzz
+        zzzzzzzzz)");
+    const Picture mask(R"(
+        ..####...
+        ..#####..
+        ..#####..
+        ..#####..
+        ...###...)");
+
+    brush fresh(3, 1);  // its costs are 0
+    expect_result(shrink_at(&fresh, photo, mask, 4, 2), R"(
+        ..####...
+        ..#......
+        ..#......
+        ..#......
+        .........)",
+                  {3, 6, 1, 4});
+
+    brush used(3, 1);
+    std::fill_n(used.cost_h, 49, 195075);
+    expect_result(shrink_at(&used, photo, mask, 4, 2), R"(
+        ..#......
+        ..#......
+        ..#......
+        ..#......
+        .........)",
+                  {3, 6, 0, 4});
+}
+
 TEST(DeSelection, SeedsNothingInTheLastRowAndColumnOfTheBrush) {
     // Rim pixels on the left keep the bar beside them; those on the right and at the bottom do not.
     expect_result(shrink(BUMP, R"(
