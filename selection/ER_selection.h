@@ -68,7 +68,7 @@ public:
 
     // Shrinks the selection from the brush core at (x, y) along the photo's edges: DoSelection with
     // the roles of selected and not selected exchanged, as far as front_competition.cpp's two rule
-    // types say. Arguments as there; rect is widened over every pixel that a front made 0.
+    // types say. Arguments as there; rect is widened over every pixel that comes out 0 from a mark.
     //
     // Nothing happens when the point lies outside the image or is not selected.
     void DeSelection(int* image, unsigned char* mask, int width, int height, int x, int y,

@@ -72,8 +72,7 @@ struct region_mask {
 };
 
 // Traces the contour of the region that holds (x, y), entering from the left, and sets the start
-// and every pixel moved to to `visited`. Values in `region` belong to the region, `visited` must be
-// one.
+// and every pixel moved to to `visited`. Values in `region` belong to the region; `visited` is one.
 //
 // Deliberate: the trace ends when the start is first looked at again, even if contour is left over;
 // where a region hangs together by one pixel, the rest stays untraced.

@@ -250,8 +250,9 @@ struct shrinking {
     // Deliberate: foreign values are won like any other and then count as not selected.
     static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
 
-    // Deliberate: foreign values that no front reached stay, and rect covers pixels that the keep
-    // front reached and that were unselected all along.
+    // Deliberate: values above 4 that no front reached stay. 2, 3 and 4 are taken for marks
+    // wherever they come from, so a lasso value 3 left in the square comes out selected. rect
+    // covers pixels that the keep front reached and that were unselected all along.
     static bool settle(unsigned char* pixel) {
         if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
         if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;

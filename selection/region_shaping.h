@@ -35,9 +35,8 @@ ZE_API void Fill_Region(unsigned char* mask, int width, int height, int left, in
 //
 // Deliberate:
 // - boundary is emptied before anything can fail, and stays so on failure.
-// - A region's size is the number of pixels inside its contour; among equals, the one found last,
-// row
-//   by row, survives. Thin regions all count 0.
+// - A region's size is the number of pixels inside its contour. Among equals the one found last
+//   survives, the search going row by row. Thin regions all count 0.
 ZE_API void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
                          ze_rect* rect);
 

@@ -130,11 +130,15 @@ int32_t fixasin(int32_t x) {
 int32_t isqrt_(int32_t x) {
     uint32_t remainder = static_cast<uint32_t>(std::max(x, 0));
     uint32_t root = 0;
-    for (uint32_t bit = 1u << 30; bit != 0; bit >>= 2) {
+    const auto decide = [&remainder, &root](uint32_t bit) {
         const bool fits = remainder >= root + bit;
         if (fits) remainder -= root + bit;
         root = root >> 1 | (fits ? bit : 0);
-    }
+    };
+    decide(1u << 30), decide(1u << 28), decide(1u << 26), decide(1u << 24);
+    decide(1u << 22), decide(1u << 20), decide(1u << 18), decide(1u << 16);
+    decide(1u << 14), decide(1u << 12), decide(1u << 10), decide(1u << 8);
+    decide(1u << 6), decide(1u << 4), decide(1u << 2), decide(1u << 0);
     return static_cast<int32_t>(remainder > root ? root + 1 : root);
 }
 

@@ -1,5 +1,4 @@
-// The Android log, as this library uses it: one line at priority ANDROID_LOG_INFO per rejected
-// call.
+// The Android log, as this library uses it: one line of priority info for each rejected call.
 #pragma once
 
 #include <android/log.h>
