@@ -7,6 +7,7 @@
 // already won, the values below; a pixel that holds one of them is never reached again.
 //
 // What sets shrinking apart from growing stands in the two rule types and nowhere else.
+
 #include <algorithm>
 #include <cstdint>
 
@@ -49,6 +50,35 @@ struct growing {
     }
 };
 
+// Shrinking: pixels won by the stroke become unselected.
+struct shrinking {
+    // The keep front starts on selected rim pixels.
+    static constexpr unsigned char SEED_VALUE = 1;
+
+    // Deliberate: so keep seeds are missing at the right and at the bottom of the brush.
+    static constexpr int UNSEEDED_EDGE = 1;
+
+    static constexpr bool CLEARS_SPARE = false;
+
+    // The point must be selected.
+    static bool may_start(const unsigned char* mask, int width, int height, int x, int y) {
+        return x >= 0 && x < width && y >= 0 && y < height && mask[x + ptrdiff_t{y} * width] == 1;
+    }
+
+    // Deliberate: foreign values are won like any other and then count as not selected.
+    static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
+
+    // Deliberate: values above 4 that no front reached stay. 2, 3 and 4 are taken for marks
+    // wherever they come from, so a lasso value 3 left in the square comes out selected. rect
+    // covers pixels that the keep front reached and that were unselected all along.
+    static bool settle(unsigned char* pixel) {
+        if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
+        if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;
+        *pixel = 0;
+        return true;
+    }
+};
+
 // The four neighbours, in the order in which the fronts visit them.
 enum direction { LEFT, RIGHT, UP, DOWN, DIRECTIONS };
 constexpr int DX[DIRECTIONS] = {-1, 1, 0, 0};
@@ -79,7 +109,7 @@ public:
     // Prices the pixels under the brush and queues the seeds of both fronts. False when the list is
     // broken.
     bool price_and_seed() {
-        const window seeded = square_in_image(Rules::UNSEEDED_EDGE);
+        const ze_rect seeded = square_in_image(Rules::UNSEEDED_EDGE);
         for (int py = seeded.top; py <= seeded.bottom; ++py) {
             for (int px = seeded.left; px <= seeded.right; ++px) {
                 const ptrdiff_t cell = cell_at(px, py);
@@ -118,7 +148,7 @@ public:
 
     // Turns the marks of the competition into plain mask values, over the whole square.
     void settle(ze_rect* rect) {
-        const window all = square_in_image(0);
+        const ze_rect all = square_in_image(0);
         for (int py = all.top; py <= all.bottom; ++py) {
             for (int px = all.left; px <= all.right; ++px) {
                 if (Rules::settle(&mask_at(px, py))) include(rect, px, py);
@@ -128,13 +158,9 @@ public:
     }
 
 private:
-    struct window {
-        int left, right, top, bottom;
-    };
-
     // The brush square without its last `omitted` rows and columns, clipped to the image; empty
     // for a negative radius.
-    window square_in_image(int omitted) const {
+    ze_rect square_in_image(int omitted) const {
         const int64_t r = engine.radius;
         const auto first = [r](int centre, int size) {
             return static_cast<int>(std::clamp<int64_t>(centre - r, 0, size));
@@ -230,35 +256,6 @@ private:
     const int x;
     const int y;
     const ptrdiff_t side;
-};
-
-// Shrinking: pixels won by the stroke become unselected.
-struct shrinking {
-    // The keep front starts on selected rim pixels.
-    static constexpr unsigned char SEED_VALUE = 1;
-
-    // Deliberate: so keep seeds are missing at the right and at the bottom of the brush.
-    static constexpr int UNSEEDED_EDGE = 1;
-
-    static constexpr bool CLEARS_SPARE = false;
-
-    // The point must be selected.
-    static bool may_start(const unsigned char* mask, int width, int height, int x, int y) {
-        return x >= 0 && x < width && y >= 0 && y < height && mask[x + ptrdiff_t{y} * width] == 1;
-    }
-
-    // Deliberate: foreign values are won like any other and then count as not selected.
-    static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
-
-    // Deliberate: values above 4 that no front reached stay. 2, 3 and 4 are taken for marks
-    // wherever they come from, so a lasso value 3 left in the square comes out selected. rect
-    // covers pixels that the keep front reached and that were unselected all along.
-    static bool settle(unsigned char* pixel) {
-        if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
-        if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;
-        *pixel = 0;
-        return true;
-    }
 };
 
 // Runs one stroke at (x, y); see ER_selection for the arguments. Does nothing on an engine without
