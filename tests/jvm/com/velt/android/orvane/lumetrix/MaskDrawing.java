@@ -4,8 +4,8 @@ import java.util.Arrays;
 import java.util.List;
 
 /**
- * A mask drawn as text: {@code .} is 0, {@code #} is 1, {@code 2} to {@code 9} are themselves. Lines
- * are rows.
+ * A mask drawn as text: {@code .} is 0, {@code #} is 1, {@code 2} to {@code 9} are themselves.
+ * Lines are rows.
  *
  * <p>Two are equal when they look the same; a test compares them as wholes and prints both.
  */

@@ -522,8 +522,10 @@ class UtilStrokesTest {
             #####""");
         for (int i = 0; i < photo.length; ++i) photo[i] = 0x01020304 * i;
         int[] before = photo.clone();
-        for (int mode = GROW; mode <= LASSO_REMOVE; ++mode) dab(mode, 2, 2, 1);
-        assertArrayEquals(before, photo);
+        for (int mode = GROW; mode <= LASSO_REMOVE; ++mode) {
+            dab(mode, 2, 2, 1);
+            assertArrayEquals(before, photo, "mode " + mode);
+        }
     }
 
     /** Begins on a photo of one colour with the selection given and an empty object box. */
