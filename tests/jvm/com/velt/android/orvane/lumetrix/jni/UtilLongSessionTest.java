@@ -1,5 +1,11 @@
 package com.velt.android.orvane.lumetrix.jni;
 
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.ERASE;
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.GROW;
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.LASSO_ADD;
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.LASSO_REMOVE;
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.PAINT;
+import static com.velt.android.orvane.lumetrix.jni.UtilStrokesTest.SHRINK;
 import static org.junit.jupiter.api.Assertions.assertArrayEquals;
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertTrue;
@@ -19,13 +25,6 @@ import org.junit.jupiter.api.Test;
 class UtilLongSessionTest {
     private static final int STROKES = 20_000;
     private static final long SEED = 20_240_611;
-
-    private static final int GROW = 0;
-    private static final int SHRINK = 1;
-    private static final int PAINT = 2;
-    private static final int ERASE = 3;
-    private static final int LASSO_ADD = 4;
-    private static final int LASSO_REMOVE = 5;
 
     private static final int WIDTH = 44;
     private static final int HEIGHT = 31;

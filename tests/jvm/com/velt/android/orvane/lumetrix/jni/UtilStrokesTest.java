@@ -14,12 +14,12 @@ import org.junit.jupiter.params.provider.ValueSource;
 
 /** Each mode of a stroke on small masks: what it changes, what it reports, and the object box. */
 class UtilStrokesTest {
-    private static final int GROW = 0;
-    private static final int SHRINK = 1;
-    private static final int PAINT = 2;
-    private static final int ERASE = 3;
-    private static final int LASSO_ADD = 4;
-    private static final int LASSO_REMOVE = 5;
+    static final int GROW = 0;
+    static final int SHRINK = 1;
+    static final int PAINT = 2;
+    static final int ERASE = 3;
+    static final int LASSO_ADD = 4;
+    static final int LASSO_REMOVE = 5;
 
     private MaskDrawing mask;
     private int[] photo;
