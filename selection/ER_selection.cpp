@@ -116,7 +116,3 @@ bool has_buffers(const ER_selection& engine) {
     return engine.queue && engine.queue->index && engine.brush_map && engine.node_map &&
            engine.cost_h && engine.cost_v && engine.node_pool;
 }
-
-ptrdiff_t brush_side(const ER_selection& engine) {
-    return engine.radius < 0 ? 0 : 2 * static_cast<ptrdiff_t>(engine.radius) + 1;
-}

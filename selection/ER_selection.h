@@ -43,7 +43,8 @@ public:
     //   core_radius  in pixels; below 0 there is no core
     //
     // When an allocation fails, or the square has more cells than memory can have, the buffers from
-    // that one on stay null, nothing is reported, and strokes do nothing.
+    // that one on stay null, nothing is reported, and brush strokes do nothing. More cells than an
+    // int can count are not asked for.
     void initial(int radius, int core_radius);
 
     // As initial(), but returns at once when both values are the current ones, and leaves
@@ -83,16 +84,20 @@ public:
     void Brush_Add(unsigned char* mask, int width, int height, int x, int y, ze_rect* rect);
     void Brush_Del(unsigned char* mask, int width, int height, int x, int y, ze_rect* rect);
 
-    // Draws a segment of a lasso's outline from (x0, y0) to (x1, y1), both included: one pixel for
-    // each step along its longer axis. The value drawn remembers the pixel: adding makes 1 of 0 and
-    // 5 of anything else, removing makes 4 of 1 and 3 of anything else. ze_lasso_add_fill_mask and
-    // ze_lasso_del_fill_mask turn them back. rect is widened over every pixel drawn.
+    // Draws a segment of a lasso's outline between (x0, y0) and (x1, y1), in either direction the
+    // same: one pixel for each step along its longer axis, the ends' steps included. The value
+    // drawn remembers the pixel: adding makes 1 of 0 and 5 of anything else, removing makes 4 of 1
+    // and 3 of anything else. ze_lasso_add_fill_mask and ze_lasso_del_fill_mask turn them back.
+    // rect is widened over every pixel drawn.
     //
     // Nothing happens when an end lies outside the image. No brush is needed: both work on an
     // engine without buffers too.
     //
-    // Deliberate: a pixel drawn twice, such as the joint of two segments, ends as 5 or 3, whatever
-    // it held at first.
+    // Deliberate:
+    // - A pixel drawn twice, such as the joint of two segments, ends as 5 or 3, whatever it held at
+    //   first.
+    // - The slope is cut off after 16 binary digits and wraps where the ends lie more than 32767
+    //   apart across, so a segment of tens of thousands of pixels may end beside its end point.
     void Lasso_Add(unsigned char* mask, int width, int height, int x0, int y0, int x1, int y1,
                    ze_rect* rect);
     void Lasso_Del(unsigned char* mask, int width, int height, int x0, int y0, int x1, int y1,
@@ -115,10 +120,11 @@ public:
 bool has_buffers(const ER_selection& engine);
 
 // Side of the brush square in cells; 0 for a negative radius.
-ptrdiff_t brush_side(const ER_selection& engine);
+inline ptrdiff_t brush_side(const ER_selection& engine) {
+    return engine.radius < 0 ? 0 : 2 * static_cast<ptrdiff_t>(engine.radius) + 1;
+}
 
 // The cell of `engine`'s brush at (dx, dy) from its centre.
 inline ptrdiff_t brush_cell(const ER_selection& engine, ptrdiff_t dx, ptrdiff_t dy) {
-    return (dy + engine.radius) * (2 * static_cast<ptrdiff_t>(engine.radius) + 1) + dx +
-           engine.radius;
+    return (dy + engine.radius) * brush_side(engine) + dx + engine.radius;
 }

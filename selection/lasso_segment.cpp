@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <utility>
 
 #include "selection/ER_selection.h"
 #include "selection/lasso_values.h"
