@@ -42,7 +42,7 @@ double random_double(random_source& random) {
     }
 }
 
-std::string run_fixed_point(random_source& random, tally*) {
+void run_fixed_point(random_source& random, findings* found) {
     static reference::fixed_point model;
     const int32_t x = random_fixed(random), y = random_fixed(random);
     const double d = random_double(random);
@@ -97,30 +97,25 @@ std::string run_fixed_point(random_source& random, tally*) {
          [](i, i, double f) { return model.round_(f); }},
     };
     for (const call& c : calls) {
-        const int32_t found = c.library(x, y, d);
-        const int32_t expected = c.expected(x, y, d);
-        if (found == expected && g_fix_errno == model.g_fix_errno) continue;
-        return std::string(c.name) + "(" + std::to_string(x) + ", " + std::to_string(y) + ", " +
-               std::to_string(d) + ") is " + std::to_string(found) + ", the model has " +
-               std::to_string(expected) + "; error " + std::to_string(g_fix_errno) + " and " +
-               std::to_string(model.g_fix_errno);
+        found->compare(c.name, c.library(x, y, d), c.expected(x, y, d));
+        found->compare("the error of the same call", g_fix_errno, model.g_fix_errno);
     }
-    const double found = fixtof(x), expected = model.fixtof(x);
-    return found == expected ? "" : "fixtof differs";
+    found->compare_doubles("fixtof", fixtof(x), model.fixtof(x));
 }
 
-std::string run_fixed_tables(random_source&, tally*) {
+void run_fixed_tables(random_source&, findings* found) {
     static const reference::fixed_point model;
-    std::string difference = first_difference("_cos_tbl", _cos_tbl, model.cos_tbl);
-    if (difference.empty()) difference = first_difference("_tan_tbl", _tan_tbl, model.tan_tbl);
-    if (difference.empty()) difference = first_difference("_acos_tbl", _acos_tbl, model.acos_tbl);
-    if (radtofix_r != model.radtofix_r || fixtorad_r != model.fixtorad_r) return "the constants";
-    return difference;
+    found->compare_arrays("_cos_tbl", _cos_tbl, model.cos_tbl);
+    found->compare_arrays("_tan_tbl", _tan_tbl, model.tan_tbl);
+    found->compare_arrays("_acos_tbl", _acos_tbl, model.acos_tbl);
+    found->compare("radtofix_r", radtofix_r, model.radtofix_r);
+    found->compare("fixtorad_r", fixtorad_r, model.fixtorad_r);
 }
 
 }  // namespace
 
 const std::vector<family> fixed_point_families = {
-    {"fixed-point", "every function of the fixed-point toolkit, each case", run_fixed_point},
-    {"fixed-tables", "its tables and constants", run_fixed_tables},
+    {"fixed-point", "every function of the fixed-point toolkit, each case", 1000000,
+     run_fixed_point},
+    {"fixed-tables", "its tables and constants", 16, run_fixed_tables},
 };

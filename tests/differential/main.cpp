@@ -1,7 +1,11 @@
 // Compares the library with slow models of it on random cases.
 //
-// Every case has a seed of its own, made of the run's seed, the family and the case's number. On a
-// difference the run ends and says how to repeat just that case.
+// Every case has a seed of its own, made of the run's seed, the family and the case's number; the
+// seed also chooses where the library's buffers lie. On a difference the run ends and says how to
+// repeat just that case.
+//
+// With --digests it prints a digest of all that the library gave in a fixed number of cases: the
+// same on every machine, with every compiler, wherever the buffers lie.
 
 #include <chrono>
 #include <cinttypes>
@@ -12,6 +16,7 @@
 #include <vector>
 
 #include "tests/differential/family.h"
+#include "tests/differential/placed_vector.h"
 
 namespace {
 
@@ -19,11 +24,14 @@ using steady = std::chrono::steady_clock;
 
 constexpr char USAGE[] =
     "usage: differential [--seconds N] [--cases N] [--seed S] [--family NAME] [--case SEED]\n"
+    "                    [--digests short|long]\n"
     "  --seconds N    run for N seconds in all (default 10)\n"
     "  --cases N      run at least N cases of every family, however long it takes\n"
     "  --seed S       draw the cases from S (default 1)\n"
     "  --family NAME  only this family; may be given again\n"
-    "  --case SEED    only the case with this seed, of the one --family given\n";
+    "  --case SEED    only the case with this seed, of the one --family given\n"
+    "  --digests SIZE the digest of each family, of as many cases as are committed; short: of a\n"
+    "                 sixteenth\n";
 
 struct options {
     double seconds = 10;
@@ -32,14 +40,15 @@ struct options {
     std::vector<std::string> families;
     bool single = false;
     uint64_t single_seed = 0;
+    uint64_t digest_share = 0;  // digests of one case in so many; 0: no digests
 };
 
 struct run_state {
     const family* f;
     uint64_t cases = 0;
     double seconds = 0;
-    tally seen;
-    std::map<std::string, uint64_t> first_case;  // in which each thing seen came up first
+    findings found;
+    std::map<std::string, uint64_t> first_case;  // in which each thing counted came up first
 };
 
 [[noreturn]] void refuse(const std::string& why) {
@@ -70,6 +79,10 @@ options read_options(int count, char** arguments) {
             o.single_seed = number("--case", value);
         } else if (option == "--family" && value) {
             o.families.push_back(value);
+        } else if (option == "--digests" && value && value == std::string("short")) {
+            o.digest_share = 16;
+        } else if (option == "--digests" && value && value == std::string("long")) {
+            o.digest_share = 1;
         } else {
             refuse("cannot make sense of '" + option + "'");
         }
@@ -100,19 +113,73 @@ uint64_t case_seed(uint64_t seed, const family& f, uint64_t number) {
     return random_source(mixer.bits() + number).bits();
 }
 
+// Where a case's buffers lie. The sanitizers see most on the heap.
+int placement_of(uint64_t seed) {
+#if defined(__SANITIZE_ADDRESS__) || defined(DRAVENTA_SANITIZED)
+    (void)seed;
+    return HEAP;
+#else
+    return static_cast<int>(seed % PLACEMENTS);
+#endif
+}
+
 // Runs one case; ends the program when library and model differ.
-void run_case(run_state* run, uint64_t seed) {
+void run_case(const family& f, uint64_t seed, int placement, findings* found) {
     random_source random(seed);
-    const std::string difference = run->f->run(random, &run->seen);
-    ++run->cases;
-    for (const auto& [what, times] : run->seen) run->first_case.emplace(what, seed);
-    if (difference.empty()) return;
+    set_placement(placement);
+    f.run(random, found);
+    if (found->agree()) return;
     std::printf("DIFFERENCE in family %s, case 0x%" PRIx64
                 ":\n  %s\nrepeat it: differential "
                 "--family %s --case 0x%" PRIx64 "\n",
-                run->f->name, seed, difference.c_str(), run->f->name, seed);
+                f.name, seed, found->first_difference().c_str(), f.name, seed);
     std::exit(1);
 }
+
+void run_case(run_state* run, uint64_t seed) {
+    run_case(*run->f, seed, placement_of(seed), &run->found);
+    ++run->cases;
+    for (const auto& [what, times] : run->found.counts()) run->first_case.emplace(what, seed);
+}
+
+// --- digests -------------------------------------------------------------------------------------
+
+constexpr uint64_t DIGEST_SEED = 1;
+
+// The digest of the first cases of a family, all with their buffers at one placement.
+uint64_t digest_at(const family& f, uint64_t cases, int placement) {
+    findings found;
+    for (uint64_t n = 0; n < cases; ++n) {
+        run_case(f, case_seed(DIGEST_SEED, f, n), placement, &found);
+    }
+    return found.digest();
+}
+
+// The placements of every buffer, one after the other, on a part of the cases.
+void check_placements(const family& f, uint64_t cases) {
+    const uint64_t expected = digest_at(f, cases, 0);
+    for (int placement = 1; placement < PLACEMENTS; ++placement) {
+        const uint64_t digest = digest_at(f, cases, placement);
+        if (digest == expected) continue;
+        std::printf("%s: with buffers at placement %d the digest of %" PRIu64
+                    " cases is %016" PRIx64 ", at placement 0 it is %016" PRIx64 "\n",
+                    f.name, placement, cases, digest, expected);
+        std::exit(1);
+    }
+}
+
+void print_digest(const family& f, uint64_t share) {
+    const uint64_t cases = (f.digest_cases + share - 1) / share;
+    check_placements(f, (cases + 15) / 16);
+    findings found;
+    for (uint64_t n = 0; n < cases; ++n) {
+        const uint64_t seed = case_seed(DIGEST_SEED, f, n);
+        run_case(f, seed, placement_of(seed), &found);
+    }
+    std::printf("%s %" PRIu64 " %016" PRIx64 "\n", f.name, cases, found.digest());
+}
+
+// --- timed runs ----------------------------------------------------------------------------------
 
 void run_for(run_state* run, const options& o, double seconds) {
     const auto start = steady::now();
@@ -125,7 +192,7 @@ void run_for(run_state* run, const options& o, double seconds) {
 }
 
 void print_seen(const run_state& run) {
-    for (const auto& [what, times] : run.seen) {
+    for (const auto& [what, times] : run.found.counts()) {
         std::printf("%-16s %12" PRIu64 "  %s, first in case 0x%" PRIx64 "\n", "", times,
                     what.c_str(), run.first_case.at(what));
     }
@@ -146,6 +213,10 @@ int main(int count, char** arguments) {
     std::setvbuf(stdout, nullptr, _IOLBF, 0);
     const options o = read_options(count, arguments);
     std::vector<run_state> runs = chosen_families(o);
+    if (o.digest_share > 0) {
+        for (const run_state& run : runs) print_digest(*run.f, o.digest_share);
+        return 0;
+    }
     if (o.single) {
         run_case(&runs.front(), o.single_seed);
         print_seen(runs.front());

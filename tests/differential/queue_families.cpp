@@ -9,27 +9,26 @@ namespace {
 // A queue of the library and one of the model, over pools with the same records.
 class queue_pair {
 public:
-    queue_pair(int nodes, int step) : records(static_cast<size_t>(nodes)), model(model_records) {
+    queue_pair(int nodes, int step, findings* f)
+        : found(f), records(static_cast<size_t>(nodes)), model(model_records) {
         library.step = model.step = step;
         for (node& n : records) n = {0, 0, 0, 0, nullptr, nullptr};
         model_records.assign(static_cast<size_t>(nodes),
                              {0, 0, 0, 0, reference::NO_NODE, reference::NO_NODE});
     }
 
-    std::string push(int n, int cost) {
+    void push(int n, int cost) {
         records[static_cast<size_t>(n)].cost = cost;
         model_records[static_cast<size_t>(n)].cost = cost;
-        const int queued = library.push(&records[static_cast<size_t>(n)]);
-        const int expected = model.push(n);
-        if (queued != expected) return "push gave " + std::to_string(queued);
-        return compare();
+        found->compare("push", library.push(&records[static_cast<size_t>(n)]), model.push(n));
+        compare();
     }
 
-    std::string pop() {
-        if (library.empty() != model.empty()) return "empty() differs";
-        if (model.head == reference::NO_NODE) return "";
-        if (number(library.pop()) != model.pop()) return "pop gave another node";
-        return compare();
+    void pop() {
+        found->compare("empty", library.empty(), model.empty());
+        if (model.head == reference::NO_NODE || !found->agree()) return;
+        found->compare("pop", number(library.pop()), model.pop());
+        compare();
     }
 
     void reset_counts() {
@@ -57,20 +56,20 @@ private:
         return n ? static_cast<int>(n - records.data()) : reference::NO_NODE;
     }
 
-    std::string compare() const {
-        if (library.count != model.count) return "count is " + std::to_string(library.count);
-        if (number(library.head) != model.head) return "another head";
-        if (number(library.tail) != model.tail) return "another tail";
+    void compare() const {
+        found->compare("count", library.count, model.count);
+        found->compare("head", number(library.head), model.head);
+        found->compare("tail", number(library.tail), model.tail);
         for (size_t k = 0; k < model.index.size(); ++k) {
-            if (number(library.index[k]) != model.index[k]) return "another index entry";
+            found->compare("index entry", number(library.index[k]), model.index[k]);
         }
         for (size_t n = 0; n < records.size(); ++n) {
-            if (number(records[n].prev) != model_records[n].prev) return "another prev";
-            if (number(records[n].next) != model_records[n].next) return "another next";
+            found->compare("prev", number(records[n].prev), model_records[n].prev);
+            found->compare("next", number(records[n].next), model_records[n].next);
         }
-        return "";
     }
 
+    findings* found;
     std::vector<node> records;
     std::vector<reference::node> model_records;
     D_Queue library;
@@ -79,21 +78,20 @@ private:
 
 // Pushes, pops, unlinks and resets on a few nodes, which are pushed again while they are queued, so
 // that lists break and close into rings.
-std::string run_queue(random_source& random, tally* seen) {
+void run_queue(random_source& random, findings* found) {
     const int nodes = random.size_up_to(60);
-    queue_pair queues(nodes, random.size_up_to(12));
+    queue_pair queues(nodes, random.size_up_to(12), found);
     const int most_cost = random.any_of({1, 5, 100});
     const bool disciplined = random.one_in(2);  // each node is pushed once
     int fresh = 0;
-    std::string difference;
-    for (int calls = random.between(1, 150); calls > 0 && difference.empty(); --calls) {
+    for (int calls = random.between(1, 150); calls > 0 && found->agree(); --calls) {
         const int kind = random.between(0, 9);
         if (kind < 6) {
             const int n = disciplined ? fresh++ : random.between(0, nodes - 1);
             if (n >= nodes) break;
-            difference = queues.push(n, random.between(0, most_cost));
+            queues.push(n, random.between(0, most_cost));
         } else if (kind < 8) {
-            difference = queues.pop();
+            queues.pop();
         } else if (!disciplined) {
             if (random.one_in(20)) {
                 queues.reset_counts();
@@ -102,12 +100,11 @@ std::string run_queue(random_source& random, tally* seen) {
             }
         }
     }
-    if (queues.rings() > 0) (*seen)["cases with a ring found"]++;
-    return difference;
+    if (queues.rings() > 0) found->count("cases with a ring found");
 }
 
 }  // namespace
 
 const std::vector<family> queue_families = {
-    {"queue", "pushes, pops and unlinked nodes on one queue", run_queue},
+    {"queue", "pushes, pops and unlinked nodes on one queue", 60000, run_queue},
 };

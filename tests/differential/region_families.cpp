@@ -1,6 +1,7 @@
 #include "selection/ER_selection.h"
 #include "selection/region_shaping.h"
 #include "tests/differential/family.h"
+#include "tests/differential/placed_vector.h"
 #include "tests/differential/random_pictures.h"
 #include "tests/reference/regions_reference.h"
 
@@ -17,25 +18,21 @@ struct region_case {
     explicit region_case(random_source& random)
         : width(random.size_up_to(200)),
           height(random.size_up_to(200)),
-          mask(random_mask(random, width, height)),
+          model_mask(random_mask(random, width, height)),
           box(random_box(random, width, height)) {
-        if (random.one_in(6)) sprinkle(random, &mask, 0, 255);
-        model_mask = mask;
+        if (random.one_in(6)) sprinkle(random, &model_mask, 0, 255);
+        mask = placed_vector<unsigned char>(model_mask);
     }
 
-    std::string compare(const ze_rect& found, const reference::rect& expected) const {
-        if (expected != reference::rect{found.left, found.right, found.top, found.bottom}) {
-            return "another rectangle";
-        }
-        return first_difference("mask", mask, model_mask);
-    }
+    void compare_masks(findings* found) const { found->compare_arrays("mask", mask, model_mask); }
 
     int width, height;
-    std::vector<unsigned char> mask, model_mask;
+    std::vector<unsigned char> model_mask;
+    placed_vector<unsigned char> mask;
     ze_rect box;
 };
 
-std::string run_fill(random_source& random, tally*) {
+void run_fill(random_source& random, findings* found) {
     region_case c(random);
     ze_rect changed = empty_beyond_image(c.width, c.height);
     reference::rect expected = {c.width, 0, c.height, 0};
@@ -43,10 +40,11 @@ std::string run_fill(random_source& random, tally*) {
                 &changed);
     reference::Fill_Region(c.model_mask, c.width, c.height, c.box.left, c.box.right, c.box.top,
                            c.box.bottom, &expected);
-    return c.compare(changed, expected);
+    found->compare("rectangle", changed, expected);
+    c.compare_masks(found);
 }
 
-std::string run_erase(random_source& random, tally*) {
+void run_erase(random_source& random, findings* found) {
     region_case c(random);
     ze_rect boundary = c.box;
     reference::rect model_boundary = {c.box.left, c.box.right, c.box.top, c.box.bottom};
@@ -54,12 +52,13 @@ std::string run_erase(random_source& random, tally*) {
     reference::rect expected = {c.width, 0, c.height, 0};
     Erase_Region(c.mask.data(), c.width, c.height, &boundary, &changed);
     reference::Erase_Region(c.model_mask, c.width, c.height, &model_boundary, &expected);
-    std::string difference = c.compare(boundary, model_boundary);
-    return difference.empty() ? c.compare(changed, expected) : difference;
+    found->compare("boundary", boundary, model_boundary);
+    found->compare("rectangle", changed, expected);
+    c.compare_masks(found);
 }
 
 // An outline over the mask, mostly closed, then the pass that turns it into a selection.
-std::string run_lasso_fill(random_source& random, tally*) {
+void run_lasso_fill(random_source& random, findings* found) {
     region_case c(random);
     const bool adds = random.one_in(2);
     ER_selection engine;
@@ -75,7 +74,7 @@ std::string run_lasso_fill(random_source& random, tally*) {
         x0 = x1;
         y0 = y1;
     }
-    c.model_mask = c.mask;
+    c.model_mask.assign(c.mask.begin(), c.mask.end());
     const auto fill = adds ? ze_lasso_add_fill_mask : ze_lasso_del_fill_mask;
     const auto model_fill =
         adds ? reference::ze_lasso_add_fill_mask : reference::ze_lasso_del_fill_mask;
@@ -83,14 +82,14 @@ std::string run_lasso_fill(random_source& random, tally*) {
         fill(c.mask.data(), c.width, c.height, c.box.left, c.box.right, c.box.top, c.box.bottom);
     const int expected = model_fill(c.model_mask, c.width, c.height, c.box.left, c.box.right,
                                     c.box.top, c.box.bottom);
-    if (result != expected) return "another result";
-    return first_difference("mask", c.mask, c.model_mask);
+    found->compare("result", result, expected);
+    c.compare_masks(found);
 }
 
 }  // namespace
 
 const std::vector<family> region_families = {
-    {"fill", "Fill_Region on masks up to 200 x 200", run_fill},
-    {"erase", "Erase_Region, likewise", run_erase},
-    {"lasso-fill", "both lasso fills on outlines, likewise", run_lasso_fill},
+    {"fill", "Fill_Region on masks up to 200 x 200", 24000, run_fill},
+    {"erase", "Erase_Region, likewise", 24000, run_erase},
+    {"lasso-fill", "both lasso fills on outlines, likewise", 24000, run_lasso_fill},
 };
