@@ -115,7 +115,7 @@ uint64_t case_seed(uint64_t seed, const family& f, uint64_t number) {
 
 // Where a case's buffers lie. The sanitizers see most on the heap.
 int placement_of(uint64_t seed) {
-#if defined(__SANITIZE_ADDRESS__) || defined(DRAVENTA_SANITIZED)
+#ifdef DRAVENTA_SANITIZED
     (void)seed;
     return HEAP;
 #else

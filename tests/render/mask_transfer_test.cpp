@@ -167,6 +167,19 @@ TEST(ze_modify_mask, DoesNothingInAnEmptyRectangle) {
 
 // ---- The small mask's last row and column
 
+TEST(ze_modify_mask, DoesNothingUnlessTheRatioIsAboveZero) {
+    // With a ratio of 0 the first block would have no end.
+    const Picture before(4, 4, 7);
+    for (const float ratio : {0.0f, -0.0f, -0.5f, std::numeric_limits<float>::quiet_NaN()}) {
+        for (const int flag : {ADD, REMOVE}) {
+            EXPECT_EQ(transferred(Picture(2, 2, 1), before, large_photo(4, 4, 0), ratio,
+                                  {0, 1, 0, 1}, flag),
+                      before)
+                << ratio;
+        }
+    }
+}
+
 TEST(ze_modify_mask, OnTheLastRowAndColumnCopiesOnlyValuesEqualToOneMinusFlag) {
     const Picture small(R"(
         ..#
@@ -487,10 +500,12 @@ TEST(ze_modify_mask, ABlockBeyondTheRowReachesIntoTheNext) {
 }
 
 TEST(ze_modify_mask, ABlockWithoutPixelsChangesNothing) {
-    for (const int flag : {ADD, REMOVE}) {
-        EXPECT_EQ(transferred(Picture("#. .."), Picture(1, 1, 7), large_photo(1, 1, 0), 4.0f,
-                              {0, 0, 0, 0}, flag),
-                  Picture(1, 1, 7));
+    for (const Picture& small : {Picture("#. .."), Picture("#. .#")}) {
+        for (const int flag : {ADD, REMOVE}) {
+            EXPECT_EQ(transferred(small, Picture(1, 1, 7), large_photo(1, 1, 0), 4.0f, {0, 0, 0, 0},
+                                  flag),
+                      Picture(1, 1, 7));
+        }
     }
 }
 

@@ -463,6 +463,18 @@ TEST(D_Queue_pop, MovesIndexEntriesOnUpToTheFirstNull) {
     EXPECT_EQ(f.q.index[3], f[0]);
 }
 
+TEST(D_Queue_pop, MovesAll100IndexEntriesOnAndNoMore) {
+    filled_queue f(1);
+    index_inside_an_array around(&f.q);
+    for (int i = 0; i < 101; ++i) f.push(i);
+    f.q.index[100] = f[50];  // behind the index
+
+    f.q.pop();
+
+    for (size_t k = 0; k < 100; ++k) EXPECT_EQ(f.q.index[k], f[k + 1]) << k;
+    EXPECT_EQ(f.q.index[100], f[50]);
+}
+
 TEST(D_Queue_pop, NeverCountsBelowZero) {
     linked_queue f(100, {1, 2, 3});
     f.q.count = 1;

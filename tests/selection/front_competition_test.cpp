@@ -602,6 +602,27 @@ TEST(DoSelection, AbandonsTheStrokeOnABrokenListWhileSeeding) {
     EXPECT_EQ(fresh, GROWN_ON_FLAT);
 }
 
+TEST(DoSelection, AbandonsTheStrokeOnABrokenListWhileSeedingTheCore) {
+    // The list of the test before. Without unselected rim pixels the core has the first seeds.
+    engine e;
+    node cheap = {0, 0, -1, 0, nullptr, nullptr};
+    node dear = {0, 0, 5, 0, nullptr, nullptr};
+    cheap.next = &dear;
+    e.queue->head = &cheap;
+    e.queue->tail = &dear;
+    Picture mask(7, 7, 1);
+    mask.at(3, 3) = 0;
+    const Picture before = mask;
+
+    EXPECT_EQ(e.grow(FLAT, &mask, 3, 3), (ze_rect{7, 0, 7, 0}));
+
+    EXPECT_EQ(mask, before);
+    EXPECT_EQ(e.nodes_used, 2);
+    EXPECT_EQ(e.node_map[brush_cell(e, -1, -1)], &e.node_pool[0]);
+    EXPECT_EQ(e.node_map[brush_cell(e, 0, -1)], &e.node_pool[1]);
+    EXPECT_EQ(e.node_map[brush_cell(e, 1, -1)], nullptr);
+}
+
 TEST(DoSelection, CommitsWhatIsWonWhenTheListBreaksWhileGrowing) {
     // The seeds go before `free`. The first step that costs something, from the core's upper right
     // pixel to the top, has to go before `dear`, which has no `prev`.
@@ -743,6 +764,21 @@ TEST(DoSelection, UnlinksFromTheMiddle) {
     hand_made_stroke s;
     s.queue({&s.from, &s.a, &s.lowered, &s.b});
     s.run(1);
+    EXPECT_EQ(s.a.next, &s.b);
+    EXPECT_EQ(s.b.prev, &s.a);
+    EXPECT_EQ(s.e.queue->head, &s.a);
+    EXPECT_EQ(s.e.queue->tail, &s.b);
+    EXPECT_EQ(s.e.queue->count, 0);
+}
+
+TEST(DoSelection, UnlinksNothingWhereTheLoweredNodeWasNeverLinked) {
+    // As D_Queue::push leaves a node that it only counts.
+    hand_made_stroke s;
+    s.queue({&s.from, &s.a, &s.b});
+    s.run(1);
+    EXPECT_EQ(s.lowered.cost, 3);
+    EXPECT_EQ(s.lowered.prev, nullptr);
+    EXPECT_EQ(s.lowered.next, nullptr);
     EXPECT_EQ(s.a.next, &s.b);
     EXPECT_EQ(s.b.prev, &s.a);
     EXPECT_EQ(s.e.queue->head, &s.a);

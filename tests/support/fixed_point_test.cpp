@@ -244,6 +244,7 @@ TEST(fixtof, IsExact) {
 TEST(fixadd, AddsAndSaturates) {
     const binary_case cases[] = {
         {0x18000, -0x8000, ok(ONE)},
+        {-0x8000, 0x18000, ok(ONE)},
         {HIGHEST, 0, ok(HIGHEST)},
         {HIGHEST, 1, range_error(HIGHEST)},
         {0x40000000, 0x40000000, range_error(HIGHEST)},
@@ -259,6 +260,7 @@ TEST(fixadd, AddsAndSaturates) {
 TEST(fixsub, SubtractsAndSaturates) {
     const binary_case cases[] = {
         {0x18000, 0x8000, ok(ONE)},
+        {0x8000, 0x18000, ok(-ONE)},
         {0x40000000, -0x3FFFFFFF, ok(HIGHEST)},
         {0x40000000, -0x40000000, range_error(HIGHEST)},
         {1, INT_MIN, range_error(HIGHEST)},

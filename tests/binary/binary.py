@@ -1,0 +1,221 @@
+#!/usr/bin/env python3
+"""Checks the built library itself: what it exports and needs, how it is laid out, its ABI, its size,
+and that building it twice gives the same bytes.
+"""
+
+import argparse
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+import tempfile
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+COMMITTED_ABI = pathlib.Path(__file__).with_name("draventaUtil.abi")
+SIZES = ROOT / "docs" / "size.md"
+SONAME = "libdraventaUtil.so"
+PAGE = 16 * 1024  # the larger of the page sizes that Android's phones have
+GROWTH = 1.1  # how many times its listed size a library may have
+
+# The Android log, the maths and the C library with the loader that belongs to it.
+MAY_NEED = re.compile(r"lib(log|m|c)\.so(\.\d+)?|ld-linux[-\w]*\.so\.\d+")
+
+
+def output_of(*command):
+    """What a command prints; ends the check when the command fails."""
+    result = subprocess.run([str(c) for c in command], stdout=subprocess.PIPE,
+                            stderr=subprocess.STDOUT, text=True)
+    if result.returncode != 0:
+        sys.exit(f"binary: {' '.join(map(str, command))} failed:\n{result.stdout}")
+    return result.stdout
+
+
+# --- one library ---------------------------------------------------------------------------------
+# Each check returns "" or what is wrong.
+
+def check_exports(library):
+    listed = {line for line in (ROOT / "exports.txt").read_text().splitlines()
+              if line and not line.startswith("#")}
+    found = {line.split()[0] for line in
+             output_of("nm", "-D", "--defined-only", "--format=posix", library).splitlines()}
+    return " ".join([f"+{name}" for name in sorted(found - listed)]
+                    + [f"-{name}" for name in sorted(listed - found)])
+
+
+def dynamic_entries(library, tag):
+    return re.findall(rf"\({tag}\)\s+(.*)", output_of("readelf", "-dW", library))
+
+
+def names_in(entries):
+    return [re.search(r"\[(.*)\]", entry)[1] for entry in entries]
+
+
+def check_needed(library):
+    return " ".join(name for name in names_in(dynamic_entries(library, "NEEDED"))
+                    if not MAY_NEED.fullmatch(name))
+
+
+def check_soname(library):
+    names = names_in(dynamic_entries(library, "SONAME"))
+    return "" if names == [SONAME] else f"{names}"
+
+
+def segments(library, kind):
+    """The fields of each program header of a kind, from the file offset on."""
+    return [line.split()[1:] for line in output_of("readelf", "-lW", library).splitlines()
+            if line.split()[:1] == [kind]]
+
+
+def is_64_bit(library):
+    return "ELF64" in output_of("readelf", "-h", library)
+
+
+def check_alignment(library):
+    if not is_64_bit(library):
+        return ""
+    return " ".join(s[-1] for s in segments(library, "LOAD") if int(s[-1], 16) < PAGE)
+
+
+def check_relro(library):
+    return "" if segments(library, "GNU_RELRO") else "no RELRO segment"
+
+
+def check_bind_now(library):
+    return "" if "BIND_NOW" in " ".join(dynamic_entries(library, "FLAGS")) else "lazy binding"
+
+
+def check_stack(library):
+    stacks = segments(library, "GNU_STACK")
+    if not stacks:
+        return "no GNU_STACK header"
+    return "executable stack" if "E" in stacks[0][-2] else ""
+
+
+def check_text_relocations(library):
+    entries = output_of("readelf", "-dW", library)
+    return "text relocations" if "TEXTREL" in entries else ""
+
+
+LIBRARY_CHECKS = {
+    "exports are those of exports.txt": check_exports,
+    "needs only log, maths and C library": check_needed,
+    "SONAME": check_soname,
+    "segments aligned to 16 KiB (64-bit)": check_alignment,
+    "RELRO": check_relro,
+    "BIND_NOW": check_bind_now,
+    "no executable stack": check_stack,
+    "no text relocations": check_text_relocations,
+}
+
+
+def check_branch_protection(objects):
+    """The names of the objects without branch protection, of those below a folder."""
+    found = sorted(pathlib.Path(objects).rglob("*.o"))
+    if not found:
+        return f"no objects in {objects}"
+    return " ".join(o.name for o in found
+                    if not re.search("BTI.*PAC", output_of("readelf", "-nW", o)))
+
+
+# --- ABI, bytes, size ----------------------------------------------------------------------------
+
+def check_abi(debug_library, update):
+    """Compares types and functions with the committed dump; needs a library with debug info."""
+    with tempfile.TemporaryDirectory() as folder:
+        dump = pathlib.Path(folder) / "now.abi"
+        output_of("abidw", "--no-corpus-path", "--no-comp-dir-path", "--no-show-locs",
+                  "--drop-private-types", "--headers-dir", ROOT / "selection", "--headers-dir",
+                  ROOT / "support", "--out-file", dump, debug_library)
+        if update:
+            shutil.copy(dump, COMMITTED_ABI)
+        result = subprocess.run(["abidiff", COMMITTED_ABI, dump], stdout=subprocess.PIPE,
+                                stderr=subprocess.STDOUT, text=True)
+    return "" if result.returncode == 0 else result.stdout.strip()
+
+
+def check_twins(one, two):
+    same = pathlib.Path(one).read_bytes() == pathlib.Path(two).read_bytes()
+    return "" if same else f"{one} and {two} differ"
+
+
+def stripped_size(library):
+    with tempfile.TemporaryDirectory() as folder:
+        stripped = pathlib.Path(folder) / "stripped.so"
+        # The host's strip knows its own machine alone.
+        output_of("llvm-strip-19", "--strip-unneeded", library, "-o", stripped)
+        return stripped.stat().st_size
+
+
+def code_and_data(library):
+    """Bytes of code and constants, and of data."""
+    words = output_of("size", library).splitlines()[1].split()
+    return int(words[0]), int(words[1]) + int(words[2])
+
+
+def check_sizes(libraries, update):
+    measured = {arch: (stripped_size(lib), *code_and_data(lib)) for arch, lib in libraries}
+    if update:
+        rows = "".join(f"| {arch} | {file:,} | {code:,} | {data:,} |\n"
+                       for arch, (file, code, data) in measured.items())
+        SIZES.write_text(
+            "# Size of the library\n\n"
+            "Release build by g++, stripped. Bytes of the file (its segments are aligned to 16 KiB\n"
+            "on 64-bit machines), of code and constants, and of data. Two thirds of the data are\n"
+            "the tables of the fixed-point toolkit. `./dev binary` measures, and fails when a file\n"
+            "has grown by more than a tenth; `./dev binary --update` rewrites this page.\n\n"
+            "| processor | file | code and constants | data |\n|---|---:|---:|---:|\n" + rows)
+    wrong = []
+    listed = dict(re.findall(r"^\| ([\w-]+) \| ([\d,]+) \|", SIZES.read_text(), re.M))
+    for arch, (file, _, _) in measured.items():
+        limit = int(listed.get(arch, "0").replace(",", "")) * GROWTH
+        if file > limit:
+            wrong.append(f"{arch} has {file:,} bytes, listed are {listed.get(arch)}")
+    return "; ".join(wrong)
+
+
+# --- the run -------------------------------------------------------------------------------------
+
+def pair(text):
+    name, _, path = text.partition("=")
+    return name, path
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__)
+    parser.add_argument("--library", action="append", type=pair, required=True,
+                        metavar="ARCH=FILE")
+    parser.add_argument("--protected", metavar="DIR",
+                        help="folder of objects that must have AArch64's branch protection")
+    parser.add_argument("--debug-library", metavar="FILE", help="with debug info, for the ABI")
+    parser.add_argument("--twins", nargs=2, action="append", default=[], metavar="FILE",
+                        help="two builds of the same library")
+    parser.add_argument("--update", action="store_true", help="commit ABI and sizes as they are")
+    parser.add_argument("--summary", help="file to append the row of the final table to")
+    arguments = parser.parse_args()
+
+    results = []
+    for arch, library in arguments.library:
+        for what, check in LIBRARY_CHECKS.items():
+            results.append((f"{arch}: {what}", check(library)))
+    if arguments.protected:
+        results.append(("aarch64: branch protection in every object",
+                        check_branch_protection(arguments.protected)))
+    if arguments.debug_library:
+        results.append(("ABI as committed", check_abi(arguments.debug_library, arguments.update)))
+    for one, two in arguments.twins:
+        results.append((f"same bytes twice: {one}", check_twins(one, two)))
+    results.append(("sizes of docs/size.md", check_sizes(arguments.library, arguments.update)))
+
+    for what, wrong in results:
+        print(f"{'WRONG' if wrong else 'ok':5}  {what}{': ' + wrong if wrong else ''}")
+    failed = sum(bool(wrong) for _, wrong in results)
+    if arguments.summary:
+        with open(arguments.summary, "a") as summary:
+            summary.write(f"binary\t{len(results) - failed} of {len(results)} properties\tall\n")
+    if failed:
+        sys.exit(f"binary: {failed} of {len(results)} properties do not hold")
+
+
+if __name__ == "__main__":
+    main()
