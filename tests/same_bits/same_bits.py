@@ -1,8 +1,8 @@
 #!/usr/bin/env python3
 """Compares the digests of several builds of the library with the committed ones.
 
-Each build is a program that prints a line "name cases digest" for each family of calls. All builds
-must print the same lines, and those of digests.txt.
+Each build has programs that print a line "name cases digest" for each family of calls, or a line
+"digest DIGEST FILE" for each stroke script. All builds must give the same, and what digests.txt says.
 """
 
 import argparse
@@ -51,8 +51,11 @@ def measure(build):
         if result.returncode != 0:
             sys.exit(f"same_bits: {label}: '{command}' failed:\n{result.stdout}")
         for line in result.stdout.splitlines():
-            family, cases, digest = line.split()
-            rows[family] = (cases, digest)
+            words = line.split()
+            if words[0] == "digest":
+                rows[pathlib.Path(words[2]).stem + ".strokes"] = ("1", words[1])
+            else:
+                rows[words[0]] = (words[1], words[2])
     print(f"measured {label}", flush=True)
     return label, rows
 

@@ -17,20 +17,28 @@ final class EditingSession implements AutoCloseable {
     private static final int CORE_AT_FIRST = 1;
 
     private final Photo photo;
+    private final CallLog calls;
     private final byte[] mask;
     private int brushRadius;
     private boolean fill = true;
 
-    /** Begins with nothing selected, the library's first brush and filling on. */
-    EditingSession(Photo photo) {
+    /**
+     * Begins with nothing selected, the library's first brush and filling on.
+     *
+     * @param calls is told of each call before it is made
+     */
+    EditingSession(Photo photo, CallLog calls) {
         this.photo = photo;
+        this.calls = calls;
         mask = new byte[photo.width() * photo.height()];
         setBrush(RADIUS_AT_FIRST, CORE_AT_FIRST);
+        calls.add(Call.INIT);
         Util.init_objectsel(photo.width(), photo.height());
     }
 
     void setBrush(int radius, int core) {
         brushRadius = radius;
+        calls.add(Call.SET_BRUSH, radius, core);
         Util.set_brush_size(radius, core);
     }
 
@@ -68,8 +76,10 @@ final class EditingSession implements AutoCloseable {
 
     private void modify(Mode mode, Point from, Point to, boolean filling, Rect changed) {
         Rect stroke = new Rect();
+        int fillFlag = filling ? 1 : 0;
+        calls.add(Call.MODIFY, mode.number(), fillFlag, from.x, from.y, to.x, to.y);
         Util.modify_objectsel(photo.pixels(), mask, photo.width(), photo.height(), from, to,
-                mode.number(), stroke, filling ? 1 : 0);
+                mode.number(), stroke, fillFlag);
         changed.left = Math.min(changed.left, stroke.left);
         changed.right = Math.max(changed.right, stroke.right);
         changed.top = Math.min(changed.top, stroke.top);
@@ -77,17 +87,20 @@ final class EditingSession implements AutoCloseable {
     }
 
     Rect invert() {
+        calls.add(Call.INVERT);
         Util.inverse_objectsel(mask, photo.width(), photo.height());
         return everything();
     }
 
     Rect reset() {
+        calls.add(Call.RESET);
         Util.reset_objectsel(mask, photo.width(), photo.height());
         return everything();
     }
 
     /** Shrinks the object box to what is selected inside it; no pixel changes. */
     Rect updateBox() {
+        calls.add(Call.UPDATE_BOX);
         Util.update_objectROI(mask, photo.width(), photo.height());
         return nothing();
     }
@@ -140,12 +153,14 @@ final class EditingSession implements AutoCloseable {
 
     /** Returns the digest of the selection and of how it looks. */
     Digest digest() {
+        calls.add(Call.DIGEST);
         Viewport whole = Viewport.fitting(photo, Digest.VIEW_WIDTH, Digest.VIEW_HEIGHT);
         return Digest.of(mask, view(whole).pixels());
     }
 
     @Override
     public void close() {
+        calls.add(Call.DESTROY);
         Util.destroy_objectsel();
     }
 

@@ -12,9 +12,10 @@ import java.util.Optional;
  * @param script the script to play
  * @param out the folder for its pictures
  * @param expected the digest that the script should end with, if one was given
+ * @param recording the file for the calls on the library, if one was given
  */
-record Options(Path script, Path out, Optional<Digest> expected) {
-    static final String USAGE = "Player SCRIPT [--out DIR] [--expect DIGEST]";
+record Options(Path script, Path out, Optional<Digest> expected, Optional<Path> recording) {
+    static final String USAGE = "Player SCRIPT [--out DIR] [--expect DIGEST] [--record FILE]";
 
     /**
      * Reads the command line.
@@ -25,6 +26,7 @@ record Options(Path script, Path out, Optional<Digest> expected) {
         Path script = null;
         Path out = Path.of("");
         Optional<Digest> expected = Optional.empty();
+        Optional<Path> recording = Optional.empty();
         for (Iterator<String> rest = arguments.iterator(); rest.hasNext(); ) {
             String argument = rest.next();
             if (argument.equals("--out")) {
@@ -35,6 +37,8 @@ record Options(Path script, Path out, Optional<Digest> expected) {
                 if (expected.isEmpty()) {
                     throw wrong(Words.quote(digest) + " is no digest of 8 hexadecimal digits");
                 }
+            } else if (argument.equals("--record")) {
+                recording = Optional.of(path(value(argument, rest)));
             } else if (argument.startsWith("--")) {
                 throw wrong("there is no option " + argument);
             } else if (script != null) {
@@ -44,7 +48,7 @@ record Options(Path script, Path out, Optional<Digest> expected) {
             }
         }
         if (script == null) throw wrong("no script is given");
-        return new Options(script, out, expected);
+        return new Options(script, out, expected, recording);
     }
 
     private static String value(String option, Iterator<String> rest) {

@@ -25,6 +25,7 @@ public final class Player {
             "",
             "  --out DIR        folder for the pictures, made if missing (default: here)",
             "  --expect DIGEST  end with status 1 unless the selection has this digest",
+            "  --record FILE    write the calls on the library there, for a replay without Java",
             "  --help           this text",
             "",
             "Status: 0 played, 1 played with another digest, 2 not played.",
@@ -85,12 +86,15 @@ public final class Player {
         Photo photo = readPhoto(script);
         for (Command command : script.commands()) command.check(photo);
         try (PictureFolder pictures = openFolder(script.snapshots());
-                EditingSession session = new EditingSession(photo)) {
+                CallLog calls = openLog(photo);
+                EditingSession session = new EditingSession(photo, calls)) {
             perform(script.commands(), new Stage(session, new StrokeTable(out), pictures));
             commit(script.snapshots(), pictures);
             Digest digest = session.digest();
             out.println("digest " + digest);
             return digest;
+        } catch (IOException e) {
+            throw unrecordable(e);
         }
     }
 
@@ -124,6 +128,11 @@ public final class Player {
         }
     }
 
+    private CallLog openLog(Photo photo) throws IOException {
+        if (options.recording().isEmpty()) return CallLog.NONE;
+        return Recording.open(options.recording().get(), photo);
+    }
+
     private void perform(List<Command> commands, Stage stage) throws ScriptException {
         for (Command command : commands) {
             try {
@@ -141,6 +150,12 @@ public final class Player {
         } catch (IOException e) {
             throw unwritable(snapshots.get(0), e);
         }
+    }
+
+    private ScriptException unrecordable(IOException e) {
+        return new ScriptException(ScriptException.WHOLE_FILE, "the calls cannot be written to "
+                + Words.quote(options.recording().orElseThrow().toString()) + ": " + e,
+                "a file to write to");
     }
 
     private ScriptException unwritable(Command command, IOException e) {

@@ -18,7 +18,7 @@ class EditingSessionTest {
             List.of(new Point(2, 1), new Point(5, 1), new Point(5, 4));
 
     private final Photo photo = new Photo(WIDTH, HEIGHT, new int[WIDTH * HEIGHT]);
-    private final EditingSession session = new EditingSession(photo);
+    private final EditingSession session = new EditingSession(photo, CallLog.NONE);
 
     @AfterEach
     void close() {

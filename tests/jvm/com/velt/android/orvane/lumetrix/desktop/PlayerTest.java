@@ -351,6 +351,7 @@ class PlayerTest {
         "a b, '\"b\" is a second script'",
         "a --out, --out lacks its value",
         "a --expect, --expect lacks its value",
+        "a --record, --record lacks its value",
         "a --expect 12, '\"12\" is no digest of 8 hexadecimal digits'",
         "a --fast, there is no option --fast"})
     void wrongCommandLineIsOneLine(String arguments, String message) {
@@ -358,14 +359,16 @@ class PlayerTest {
         PlayerRun run = PlayerRun.of(words);
         assertEquals(2, run.status());
         assertEquals(List.of("Player: " + message
-                + ", expected Player SCRIPT [--out DIR] [--expect DIGEST]"), run.err());
+                + ", expected Player SCRIPT [--out DIR] [--expect DIGEST] [--record FILE]"),
+                run.err());
     }
 
     @Test
     void helpListsOptionsAndCommands() {
         PlayerRun run = PlayerRun.of("--help");
         assertEquals(0, run.status());
-        assertTrue(run.out().contains("Usage: Player SCRIPT [--out DIR] [--expect DIGEST]"));
+        assertTrue(run.out().contains(
+                "Usage: Player SCRIPT [--out DIR] [--expect DIGEST] [--record FILE]"));
         for (String usage : ScriptParser.usages()) assertTrue(run.out().contains("  " + usage));
     }
 

@@ -19,8 +19,9 @@ import org.junit.jupiter.api.BeforeEach;
 import org.junit.jupiter.api.Test;
 
 /**
- * One session of many thousand random calls on a small photo. After each stroke the mask, the
- * stroke's rectangle and the object box are held against what holds for every stroke of its mode.
+ * One session of many thousand random calls of every native method on a small photo. After each
+ * stroke the mask, the stroke's rectangle and the object box are held against what holds for every
+ * stroke of its mode, and every picture against what holds for all of its kind.
  */
 class UtilLongSessionTest {
     private static final int STROKES = 20_000;
@@ -28,6 +29,12 @@ class UtilLongSessionTest {
 
     private static final int WIDTH = 44;
     private static final int HEIGHT = 31;
+    private static final int VIEW_WIDTH = 38;
+    private static final int VIEW_HEIGHT = 27;
+
+    /** No colours of the photo. */
+    private static final int FIRST_DASH = 0x00000001;
+    private static final int SECOND_DASH = 0x00000002;
 
     private final Random random = new Random(SEED);
     private final int[] photo = patches();
@@ -53,6 +60,8 @@ class UtilLongSessionTest {
         int[] strokesWithEffect = new int[6];
         for (int i = 0; i < STROKES; ++i) {
             if (i % 40 == 39) changeSomethingElse();
+            if (i % 10 == 9) drawPictures();
+            if (i % 100 == 99) endAndBegin();
             int mode = random.nextInt(6);
             if (drawStroke(i, mode)) ++strokesWithEffect[mode];
             assertArrayEquals(photoBefore, photo, stroke);
@@ -187,6 +196,155 @@ class UtilLongSessionTest {
                     random.nextInt(60) - 8, random.nextInt(50) - 8));
             default -> changeBrush();
         }
+    }
+
+    /** Without an engine a stroke does nothing; a new session begins with an empty box. */
+    private void endAndBegin() {
+        byte[] maskBefore = mask.clone();
+        Util.destroy_objectsel();
+        Rect changed = new Rect(1, 2, 3, 4);
+        Point middle = new Point(WIDTH / 2, HEIGHT / 2);
+        Util.modify_objectsel(photo, mask, WIDTH, HEIGHT, middle, middle, PAINT, changed, 1);
+        assertTrue(isEmpty(changed), "a stroke without an engine reports " + changed);
+        assertArrayEquals(maskBefore, mask, "a stroke without an engine");
+        assertEquals(1, Util.init_objectsel(WIDTH, HEIGHT));
+        assertEquals(new Rect(WIDTH - 1, HEIGHT - 1, 0, 0), objectBox());
+    }
+
+    /** Calls what leaves session and selection as they are. */
+    private void drawPictures() {
+        byte[] maskBefore = mask.clone();
+        Rect box = objectBox();
+
+        checkColourOnGrey();
+        checkReverse();
+        float scale = new float[] {0.5f, 1, 2}[random.nextInt(3)];
+        int offsetX = random.nextInt(60) - 8;
+        int offsetY = random.nextInt(50) - 8;
+        Rect area = randomArea();
+        checkImagePoints(scale, offsetX, offsetY);
+        checkView(scale, offsetX, offsetY, area);
+        checkOutlinedView(scale, offsetX, offsetY, area);
+        checkSmallViews(area);
+        int[] array = Util.nativeIntAlloc(radius);
+        assertArrayEquals(new int[radius], array);
+        assertEquals(0, Util.nativeIntRelease(array));
+        Util.reinit_objectsel(mask, WIDTH, HEIGHT, area);
+        Util.reset_fill_ROI(WIDTH, HEIGHT);
+
+        assertArrayEquals(maskBefore, mask, "drawing after " + stroke);
+        assertEquals(box, objectBox(), "drawing after " + stroke);
+        assertEquals(radius, Util.get_brush_radius());
+    }
+
+    private void checkColourOnGrey() {
+        int[] picture = new int[photo.length];
+        Util.draw_withmask(photo, picture, mask, WIDTH, new Rect(0, 0, WIDTH - 1, HEIGHT - 1));
+        for (int i = 0; i < mask.length; ++i) {
+            assertEquals(mask[i] == 1 ? photo[i] : grey(photo[i]), picture[i], stroke);
+        }
+    }
+
+    private void checkReverse() {
+        int[] picture = new int[photo.length];
+        byte[] inverted = mask.clone();
+        Util.draw_reversemask(photo, picture, inverted, WIDTH, HEIGHT);
+        for (int i = 0; i < mask.length; ++i) {
+            assertEquals(mask[i] == 1 ? grey(photo[i]) : photo[i], picture[i], stroke);
+            assertEquals(mask[i] == 1 ? 0 : 1, inverted[i], stroke);
+        }
+    }
+
+    private void checkImagePoints(float scale, int offsetX, int offsetY) {
+        int[] points = new int[VIEW_WIDTH + VIEW_HEIGHT];
+        Util.native_setImagePoints(VIEW_WIDTH, VIEW_HEIGHT, 0, 0, scale, offsetX, offsetY, points);
+        for (int x = 0; x < VIEW_WIDTH; ++x) {
+            assertEquals((int) Math.floor(offsetX + x * scale), points[x]);
+        }
+        for (int y = 0; y < VIEW_HEIGHT; ++y) {
+            assertEquals((int) Math.floor(offsetY + y * scale), points[VIEW_WIDTH + y]);
+        }
+    }
+
+    private void checkView(float scale, int offsetX, int offsetY, Rect area) {
+        int[] view = new int[VIEW_WIDTH * VIEW_HEIGHT];
+        assertEquals(1, Util.native_drawImage(view, VIEW_WIDTH, VIEW_HEIGHT, photo, WIDTH, HEIGHT,
+                scale, offsetX, offsetY, area));
+        for (int i = 0; i < view.length; ++i) {
+            int shown = pixelAt(offsetX + i % VIEW_WIDTH * scale, offsetY + i / VIEW_WIDTH * scale);
+            assertEquals(inView(area, i) ? photo[shown] : 0, view[i], "drawn to " + area);
+        }
+    }
+
+    /** On the edges of the area, whatever is selected is outline; elsewhere it may be. */
+    private void checkOutlinedView(float scale, int offsetX, int offsetY, Rect area) {
+        int[] view = new int[VIEW_WIDTH * VIEW_HEIGHT];
+        assertEquals(1, Util.native_drawImageWithMaskContour(view, VIEW_WIDTH, VIEW_HEIGHT, photo,
+                WIDTH, HEIGHT, mask, scale, offsetX, offsetY, FIRST_DASH, SECOND_DASH, area));
+        for (int i = 0; i < view.length; ++i) {
+            int x = i % VIEW_WIDTH;
+            int y = i / VIEW_WIDTH;
+            int shown = pixelAt(offsetX + x * scale + 0.5, offsetY + y * scale + 0.5);
+            boolean edge = x == area.left || x == area.right || y == area.top || y == area.bottom;
+            boolean selected = mask[shown] == 1 || mask[shown] == 3;
+            checkViewPixel(view, i, area, shown, selected, edge);
+        }
+    }
+
+    private void checkSmallViews(Rect area) {
+        int[] plain = new int[VIEW_WIDTH * VIEW_HEIGHT];
+        int[] outlined = new int[VIEW_WIDTH * VIEW_HEIGHT];
+        assertEquals(1, Util.native_drawSmallImage(plain, VIEW_WIDTH, VIEW_HEIGHT, photo, WIDTH,
+                HEIGHT, area));
+        assertEquals(1, Util.native_drawSmallImageWithMaskContour(outlined, VIEW_WIDTH, VIEW_HEIGHT,
+                photo, WIDTH, HEIGHT, mask, FIRST_DASH, SECOND_DASH, area));
+        for (int i = 0; i < plain.length; ++i) {
+            int shown = pixelAt(i % VIEW_WIDTH - area.left, i / VIEW_WIDTH - area.top);
+            int x = shown % WIDTH;
+            int y = shown / WIDTH;
+            boolean border = x == 0 || x == WIDTH - 1 || y == 0 || y == HEIGHT - 1;
+            assertEquals(inView(area, i) ? photo[shown] : 0, plain[i], "drawn to " + area);
+            checkViewPixel(outlined, i, area, shown, mask[shown] == 1, border);
+        }
+    }
+
+    /** Nothing beyond the area; inside it the photo, or on selected pixels the dash's colour. */
+    private void checkViewPixel(int[] view, int i, Rect area, int shown, boolean selected,
+            boolean surely) {
+        boolean firstColour = (i % VIEW_WIDTH / 5 + i / VIEW_WIDTH / 5) % 2 == 0;
+        int dash = firstColour ? FIRST_DASH : SECOND_DASH;
+        if (!inView(area, i)) {
+            assertEquals(0, view[i], "drawn beyond " + area);
+        } else if (selected && (surely || view[i] != photo[shown])) {
+            assertEquals(dash, view[i], "outline drawn to " + area + " after " + stroke);
+        } else {
+            assertEquals(photo[shown], view[i], "drawn to " + area + " after " + stroke);
+        }
+    }
+
+    private static int grey(int pixel) {
+        int sum = (pixel >> 16 & 255) + (pixel >> 8 & 255) + (pixel & 255);
+        return pixel & 0xFF000000 | sum / 3 * 0x010101;
+    }
+
+    /** The photo's pixel at a position, or the outermost one beside it. */
+    private static int pixelAt(double x, double y) {
+        int column = Math.max(0, Math.min(WIDTH - 1, (int) Math.floor(x)));
+        int row = Math.max(0, Math.min(HEIGHT - 1, (int) Math.floor(y)));
+        return row * WIDTH + column;
+    }
+
+    private static boolean inView(Rect area, int i) {
+        int x = i % VIEW_WIDTH;
+        int y = i / VIEW_WIDTH;
+        return area.left <= x && x <= area.right && area.top <= y && y <= area.bottom;
+    }
+
+    private Rect randomArea() {
+        int left = random.nextInt(VIEW_WIDTH);
+        int top = random.nextInt(VIEW_HEIGHT);
+        return new Rect(left, top, left + random.nextInt(VIEW_WIDTH - left),
+                top + random.nextInt(VIEW_HEIGHT - top));
     }
 
     private void changeBrush() {

@@ -1,0 +1,77 @@
+package com.velt.android.orvane.lumetrix.desktop;
+
+import java.io.ByteArrayOutputStream;
+import java.io.IOException;
+import java.io.OutputStream;
+import java.nio.ByteBuffer;
+import java.nio.charset.StandardCharsets;
+import java.nio.file.Files;
+import java.nio.file.Path;
+
+/**
+ * A file of a photo and the calls made on it, from which a program without Java or a JPEG decoder
+ * can make the same calls.
+ *
+ * <p>All numbers are 32 bits, the highest byte first: after {@link #MAGIC} width and height of the
+ * photo and its pixels 0xAARRGGBB, row by row; then for each call a byte, {@link Call#number}, and
+ * its arguments.
+ *
+ * <p>The photo is written at once and the calls when it is closed. A file that was not written to
+ * its end lacks {@link Call#DESTROY}.
+ */
+final class Recording implements CallLog {
+    /** The first eight bytes. */
+    static final byte[] MAGIC = "calls 1\n".getBytes(StandardCharsets.US_ASCII);
+
+    private final OutputStream file;
+    private final ByteArrayOutputStream calls = new ByteArrayOutputStream();
+
+    private Recording(OutputStream file) {
+        this.file = file;
+    }
+
+    /**
+     * Begins a recording, over an older one.
+     *
+     * @throws IOException when the file cannot be written
+     */
+    static Recording open(Path path, Photo photo) throws IOException {
+        Recording recording = new Recording(Files.newOutputStream(path));
+        try {
+            recording.write(photo);
+        } catch (IOException e) {
+            recording.file.close();
+            throw e;
+        }
+        return recording;
+    }
+
+    private void write(Photo photo) throws IOException {
+        file.write(MAGIC);
+        file.write(bytes(photo.width(), photo.height()));
+        int[] row = new int[photo.width()];
+        for (int y = 0; y < photo.height(); ++y) {
+            System.arraycopy(photo.pixels(), y * row.length, row, 0, row.length);
+            file.write(bytes(row));
+        }
+    }
+
+    @Override
+    public void add(Call call, int... arguments) {
+        calls.write(call.number());
+        calls.writeBytes(bytes(arguments));
+    }
+
+    @Override
+    public void close() throws IOException {
+        try (file) {
+            calls.writeTo(file);
+        }
+    }
+
+    private static byte[] bytes(int... numbers) {
+        ByteBuffer bytes = ByteBuffer.allocate(Integer.BYTES * numbers.length);
+        bytes.asIntBuffer().put(numbers);
+        return bytes.array();
+    }
+}
