@@ -127,6 +127,7 @@ def check_abi(debug_library, update):
         output_of("abidw", "--no-corpus-path", "--no-comp-dir-path", "--no-show-locs",
                   "--drop-private-types", "--headers-dir", ROOT / "selection", "--headers-dir",
                   ROOT / "support", "--out-file", dump, debug_library)
+        dump.write_text(dump.read_text().replace(f"{ROOT}/", ""))  # wherever it was built
         if update:
             shutil.copy(dump, COMMITTED_ABI)
         result = subprocess.run(["abidiff", COMMITTED_ABI, dump], stdout=subprocess.PIPE,
