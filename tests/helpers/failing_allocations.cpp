@@ -12,12 +12,14 @@ struct {
     int nth;
     failing_allocations::extent how_long;
     int asked;
+    size_t bytes;
 } plan;
 
 // Counts one allocation; true when the plan wants it to fail.
-bool fails() {
+bool fails(size_t bytes) {
     if (!plan.active) return false;
     ++plan.asked;
+    plan.bytes += bytes;
     if (plan.nth == 0) return false;
     return plan.how_long == failing_allocations::ONCE ? plan.asked == plan.nth
                                                       : plan.asked >= plan.nth;
@@ -27,16 +29,18 @@ bool fails() {
 
 failing_allocations::failing_allocations(int nth, extent how_long) {
     if (plan.active) throw std::logic_error("allocations fail by another plan already");
-    plan = {true, nth, how_long, 0};
+    plan = {true, nth, how_long, 0, 0};
 }
 
 failing_allocations::~failing_allocations() { plan.active = false; }
 
 int failing_allocations::asked() const { return plan.asked; }
 
+size_t failing_allocations::bytes() const { return plan.bytes; }
+
 // Through the throwing forms, so that the ordinary delete takes the memory back.
 void* operator new(size_t size, const std::nothrow_t&) noexcept {
-    if (fails()) return nullptr;
+    if (fails(size)) return nullptr;
     try {
         return ::operator new(size);
     } catch (const std::bad_alloc&) {
@@ -45,7 +49,7 @@ void* operator new(size_t size, const std::nothrow_t&) noexcept {
 }
 
 void* operator new[](size_t size, const std::nothrow_t&) noexcept {
-    if (fails()) return nullptr;
+    if (fails(size)) return nullptr;
     try {
         return ::operator new[](size);
     } catch (const std::bad_alloc&) {
@@ -59,7 +63,7 @@ void* __real_calloc(size_t count, size_t size);  // NOLINT: the linker's name fo
 void* __wrap_calloc(size_t count, size_t size);  // NOLINT: what the linker makes of calloc
 
 void* __wrap_calloc(size_t count, size_t size) {
-    return fails() ? nullptr : __real_calloc(count, size);
+    return fails(count * size) ? nullptr : __real_calloc(count, size);
 }
 
 // Under AddressSanitizer, sizes that no machine has yield null too instead of ending the program.

@@ -5,6 +5,8 @@
 // from. Both count here, in one row; all other allocations are left alone.
 #pragma once
 
+#include <cstddef>
+
 class failing_allocations {
 public:
     enum extent { ONCE, FROM_THEN_ON };
@@ -18,4 +20,7 @@ public:
 
     // Allocations asked for since this object was made, those that failed included.
     int asked() const;
+
+    // Bytes that they asked for, all in all.
+    size_t bytes() const;
 };

@@ -204,6 +204,30 @@ TEST_P(Util_drawing, DrawSmallImageWithMaskContourReadsTheRectanglePinsDrawsAndR
     EXPECT_EQ(s.area.value(), (ze_rect{3, 7, 1, 5}));
 }
 
+TEST_P(Util_drawing, EveryDrawingMethodPassesThePhotosWidthAndHeight) {
+    const Pixels view(3, 5, '.');
+    const Pixels photo("ab cd ef gh");
+    const Picture mask(2, 4, 0);
+    const ze_rect area = {0, 2, 0, 4};
+    const Pixels with_edges_repeated("abb cdd eff ghh ghh");
+
+    scene image(view, photo, mask, area);
+    image.draw(&env, 1.0f, 0, 0);
+    EXPECT_EQ(image.picture(), with_edges_repeated);
+
+    scene small_image(view, photo, mask, area);
+    small_image.draw_small(&env);
+    EXPECT_EQ(small_image.picture(), with_edges_repeated);
+
+    scene outlined(view, photo, mask, area);
+    outlined.draw_outlined(&env, 1.0f, 0, 0);
+    EXPECT_EQ(outlined.picture(), with_edges_repeated);
+
+    scene small_outlined(view, photo, mask, area);
+    small_outlined.draw_small_outlined(&env);
+    EXPECT_EQ(small_outlined.picture(), with_edges_repeated);
+}
+
 TEST_P(Util_drawing, AnEmptyRectangleStillPinsReleasesAndReturnsOne) {
     const Pixels view("zzz zzz zzz");
     const Pixels photo("abc def ghi");

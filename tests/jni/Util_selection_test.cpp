@@ -265,6 +265,16 @@ TEST_P(Util_selection_arrays, ResetPinsClearsAndReleases) {
     EXPECT_EQ(g_object_boundary, (ze_rect{2, 0, 1, 0}));
 }
 
+TEST_P(Util_selection_arrays, InverseAndResetTakeAMaskOfOnePixel) {
+    fake_bytes mask("mask", {0});
+
+    UTIL_METHOD(inverse_1objectsel)(&env, nullptr, mask, 1, 1);
+    EXPECT_EQ(picture_of(mask, 1, 1), Picture("#"));
+
+    UTIL_METHOD(reset_1objectsel)(&env, nullptr, mask, 1, 1);
+    EXPECT_EQ(picture_of(mask, 1, 1), Picture("."));
+}
+
 // One line each: the one that ze_reset_objectsel would write itself never comes.
 TEST_F(Util_selection, InverseAndResetRejectNoMaskAndSizesBelowOneBeforePinning) {
     const Picture before(10, 10, 1);

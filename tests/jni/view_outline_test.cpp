@@ -383,6 +383,15 @@ TEST(draw_image_with_outline, ANeighbourBeforeTheFirstColumnIsReadInTheRowAbove)
     EXPECT_EQ(drawn(3, 3, photo, mask, 2.0f, {-1, -1}).cells[4], FIRST_DASH);
 }
 
+TEST(draw_image_with_outline, ANeighbourMayBeTheFirstEntryOfTheMask) {
+    // View pixel (1, 1) shows photo pixel (1, 1); the column before is -4, which is (0, 0).
+    const Pixels photo(4, 4, 'a');
+    Picture mask(4, 4, 1);
+    EXPECT_EQ(drawn(3, 3, photo, mask, 5.0f, {-4, -4}).cells[4], Pixels::pixel_of('a'));
+    mask.at(0, 0) = 0;
+    EXPECT_EQ(drawn(3, 3, photo, mask, 5.0f, {-4, -4}).cells[4], FIRST_DASH);
+}
+
 TEST(draw_image_with_outline, ANeighbourOutsideTheMaskMakesNoOutline) {
     // The mask lies among zeros that are not its own.
     std::vector<unsigned char> zeros(300000);

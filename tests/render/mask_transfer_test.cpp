@@ -165,8 +165,6 @@ TEST(ze_modify_mask, DoesNothingInAnEmptyRectangle) {
     }
 }
 
-// ---- The small mask's last row and column
-
 TEST(ze_modify_mask, DoesNothingUnlessTheRatioIsAboveZero) {
     // With a ratio of 0 the first block would have no end.
     const Picture before(4, 4, 7);
@@ -179,6 +177,8 @@ TEST(ze_modify_mask, DoesNothingUnlessTheRatioIsAboveZero) {
         }
     }
 }
+
+// ---- The small mask's last row and column
 
 TEST(ze_modify_mask, OnTheLastRowAndColumnCopiesOnlyValuesEqualToOneMinusFlag) {
     const Picture small(R"(

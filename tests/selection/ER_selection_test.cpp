@@ -191,6 +191,21 @@ TEST(ER_selection_initial, BeginsWithAnEmptyQueueAndNoNodesUsed) {
     EXPECT_EQ(b.nodes_used, 0);
 }
 
+TEST(ER_selection_initial, TakesAnEntryPerCellAndARecordMoreThanTheBrushHasCells) {
+    const struct {
+        int radius;
+        size_t square, brush;
+    } cases[] = {{2, 25, 21}, {0, 1, 1}, {-1, 0, 0}, {-2, 0, 0}};
+    for (const auto& c : cases) {
+        const failing_allocations counted(0);
+        const brush b(c.radius, 1);
+        EXPECT_EQ(counted.bytes(), sizeof(D_Queue) + 100 * sizeof(node*) +
+                                       c.square * (1 + sizeof(node*) + 2 * sizeof(int)) +
+                                       (c.brush + 1) * sizeof(node))
+            << c.radius;
+    }
+}
+
 TEST(ER_selection_initial, StopsAtTheFirstFailedAllocation) {
     // The queue, its index, and the buffers in the order in which they are taken.
     for (int nth = 1; nth <= 7; ++nth) {

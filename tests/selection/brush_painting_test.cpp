@@ -56,6 +56,20 @@ TEST(Brush_Del, ErasesTheDiscWithoutItsLastRowAndColumn) {
     EXPECT_EQ(changed, (ze_rect{1, 6, 1, 6}));
 }
 
+TEST(Brush_Del, ErasesWhereThePointIsInAMaskOfAnySize) {
+    brush b(1, 0);
+    Picture mask(5, 3, 1);
+    ze_rect changed = {5, 0, 3, 0};
+
+    b.Brush_Del(mask.data(), 5, 3, 3, 1, &changed);
+
+    EXPECT_EQ(mask, Picture(R"(
+        ##..#
+        ##..#
+        #####)"));
+    EXPECT_EQ(changed, (ze_rect{2, 3, 0, 1}));
+}
+
 TEST(Brush_Add, ReachesOnePixelLessToTheRightAndDownwards) {
     brush b(10, 1);
     Picture mask(31, 31, 0);

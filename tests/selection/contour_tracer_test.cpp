@@ -51,6 +51,7 @@ TEST(value_set, HoldsItsValuesAndNoOthers) {
     }
     EXPECT_FALSE(value_set().has(0));
     EXPECT_TRUE(value_set(0).has(0));
+    EXPECT_FALSE(value_set(0).has(32));
 }
 
 // ---- markers

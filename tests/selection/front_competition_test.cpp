@@ -15,6 +15,7 @@
 
 #include <algorithm>
 #include <climits>
+#include <cstdlib>
 #include <vector>
 
 #include "selection/ER_selection.h"
@@ -329,6 +330,46 @@ TEST(DoSelection, ClipsTheSquareToTheImage) {
     EXPECT_EQ(whole, Picture(3, 4, 1));
 }
 
+TEST(DoSelection, LeavesTheNextRowAloneWhereTheSquareEndsBeyondTheRow) {
+    engine e(2);
+    Picture mask(R"(
+        7........
+        7........
+        7........
+        7........
+        7........
+        7........
+        7........)");
+    EXPECT_EQ(e.grow(Picture(9, 7, 0), &mask, 7, 3), (ze_rect{6, 8, 2, 4}));
+    EXPECT_EQ(mask, Picture(R"(
+        7........
+        7........
+        7.....###
+        7.....###
+        7.....###
+        7........
+        7........)"));
+}
+
+TEST(DoSelection, ReachesNoPixelBeyondTheImage) {
+    const struct { int x, y; } points[] = {{1, 6}, {11, 6}, {6, 1}, {6, 11}};
+    for (const auto& p : points) {
+        engine e(6);
+        Picture mask(13, 13, 0);
+        e.grow(Picture(13, 13, 0), &mask, p.x, p.y);
+
+        int cells_inside = 0;
+        for (int y = 0; y < 13; ++y) {
+            for (int x = 0; x < 13; ++x) {
+                if (std::max(std::abs(x - p.x), std::abs(y - p.y)) > 6) continue;
+                const ptrdiff_t cell = brush_cell(e, x - p.x, y - p.y);
+                cells_inside += e.brush_map[cell] != BRUSH_OUTSIDE;
+            }
+        }
+        EXPECT_EQ(e.nodes_used, cells_inside) << p.x << ", " << p.y;
+    }
+}
+
 TEST(DoSelection, PricesBrushCellsOutsideImageRowAndColumnZero) {
     engine e(2);
     const Picture levels = chequered(5, 5);
@@ -539,6 +580,14 @@ TEST(DoSelection, AllocatesNothingAndForgetsItsNodes) {
     EXPECT_EQ(e.queue->head, nullptr);
     EXPECT_EQ(e.queue->count, 0);
     EXPECT_EQ(e.queue->spare, 0);
+}
+
+TEST(DoSelection, ForgetsTheNodeOfABrushOfOnePixel) {
+    engine e(0, 0);
+    Picture mask(3, 3, 0);
+    e.grow(Picture(3, 3, 0), &mask, 1, 1);
+    EXPECT_EQ(e.nodes_used, 1);  // the one cell is rim
+    EXPECT_EQ(e.node_map[0], nullptr);
 }
 
 TEST(DoSelection, ForgetsCountAndIndexOfAnEarlierStroke) {

@@ -335,6 +335,15 @@ TEST_F(objectsel, ResetClearsExactlyTheMaskAndEmptiesTheObjectBox) {
     EXPECT_EQ(take_log_lines().size(), 0u);
 }
 
+TEST_F(objectsel, ResetTakesAMaskOfOneRowOrColumn) {
+    for (const ze_rect& last : {ze_rect{2, 0, 0, 0}, ze_rect{0, 0, 2, 0}, ze_rect{0, 0, 0, 0}}) {
+        Picture mask(last.left + 1, last.top + 1, 1);
+        ze_reset_objectsel(mask.data(), mask.width, mask.height);
+        EXPECT_EQ(mask, Picture(mask.width, mask.height, 0));
+        EXPECT_EQ(g_object_boundary, last);
+    }
+}
+
 TEST_F(objectsel, ResetLogsBadInputAndChangesNothing) {
     const struct {
         bool has_mask;

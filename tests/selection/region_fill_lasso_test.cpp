@@ -366,12 +366,24 @@ TEST(lasso_fills, ReportTheWorkBufferThatTheyCannotHave) {
     }
 }
 
+// Their work buffer would have (width + 2) * (height + 2) bytes, here 3 * -1, -3 * 6 and 6 * -3.
+TEST(lasso_fills, HaveNoWorkBufferForSizesOfUnlikeSign) {
+    for (fill* const pass : {ze_lasso_add_fill_mask, ze_lasso_del_fill_mask}) {
+        unsigned char pixel = 5;
+        EXPECT_EQ(pass(&pixel, 1, -3, 0, 0, 0, 0), 0);
+        EXPECT_EQ(pass(&pixel, -5, 4, 0, 0, 0, 0), 0);
+        EXPECT_EQ(pass(&pixel, 4, -5, 0, 0, 0, 0), 0);
+        EXPECT_EQ(pixel, 5);
+    }
+}
+
 TEST(lasso_fills, TakeOneWorkBuffer) {
     for (fill* const pass : {ze_lasso_add_fill_mask, ze_lasso_del_fill_mask}) {
         Picture mask("555.444 5.5.4.4 555.444");
         const failing_allocations counted(0);
         run_in(pass, &mask, {0, 6, 0, 2});
         EXPECT_EQ(counted.asked(), 1);
+        EXPECT_LE(counted.bytes(), (7u + 2) * (3 + 2));
     }
 }
 

@@ -47,6 +47,12 @@ TEST(Fill_Region, FillsARingAndReportsOnlyTheHole) {
     EXPECT_EQ(changed, (ze_rect{2, 4, 2, 2}));
 }
 
+TEST(Fill_Region, FillsARingBelowTheSquareAtTheTop) {
+    Picture mask("... ... ... ### #.# ###");
+    EXPECT_EQ(fill(&mask), (ze_rect{1, 1, 4, 4}));
+    EXPECT_EQ(mask, Picture("... ... ... ### ### ###"));
+}
+
 TEST(Fill_Region, OnlyWidensTheRectangle) {
     Picture mask(R"(
         .....

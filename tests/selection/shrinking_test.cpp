@@ -444,11 +444,13 @@ TEST(DeSelection, SeedsTheWholeCoreWhateverItHolds) {
 
 TEST(DeSelection, SeedsNothingWithoutARadius) {
     for (const int radius : {0, -1, -7, INT_MIN}) {
-        brush b(radius, 1);
-        const stroke_result result = shrink_at(&b, BUMP, ALL_SELECTED, 4, 4);
-        EXPECT_EQ(result.mask, ALL_SELECTED) << radius;
-        EXPECT_EQ(result.rect, EMPTY) << radius;
-        EXPECT_EQ(b.nodes_used, 0) << radius;
+        for (const int at : {4, 0}) {
+            brush b(radius, 1);
+            const stroke_result result = shrink_at(&b, BUMP, ALL_SELECTED, at, at);
+            EXPECT_EQ(result.mask, ALL_SELECTED) << radius;
+            EXPECT_EQ(result.rect, EMPTY) << radius;
+            EXPECT_EQ(b.nodes_used, 0) << radius << " at " << at;
+        }
     }
 }
 

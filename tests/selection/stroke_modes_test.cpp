@@ -163,6 +163,27 @@ TEST_F(ze_modify_objectsel_modes, DispatchEachToItsOwnOperation) {
     }
 }
 
+TEST_F(ze_modify_objectsel_modes, TakeColumnAndRowOfTheFirstPoint) {
+    ze_set_brush_size(1, 1);  // a core of one pixel, and nothing inner
+    const struct {
+        int mode;
+        unsigned char before;
+        ze_rect rect;
+    } cases[] = {{0, 0, {8, 8, 2, 2}}, {1, 1, {8, 8, 2, 2}}, {2, 0, {7, 8, 1, 2}},
+                 {3, 1, {7, 8, 1, 2}}, {4, 0, {8, 8, 2, 2}}, {5, 1, {8, 8, 2, 2}}};
+    for (const auto& c : cases) {
+        Picture wide(12, 9, c.before);
+        EXPECT_EQ(stroke_from(8, 2, c.mode, &wide, 0, 8, 2), c.rect) << "mode " << c.mode;
+        EXPECT_NE(wide.at(8, 2), c.before) << "mode " << c.mode;
+
+        // The same six columns to the left and eight rows further down.
+        Picture tall(5, 12, c.before);
+        const ze_rect rect = {c.rect.left - 6, c.rect.right - 6, c.rect.top + 8, c.rect.bottom + 8};
+        EXPECT_EQ(stroke_from(2, 10, c.mode, &tall, 0, 2, 10), rect) << "mode " << c.mode;
+        EXPECT_NE(tall.at(2, 10), c.before) << "mode " << c.mode;
+    }
+}
+
 TEST_F(ze_modify_objectsel_modes, ReadTheSecondPointForLassosOnly) {
     for (const int mode : {0, 1, 2, 3}) {
         Picture here(12, 9, mode % 2);

@@ -247,10 +247,13 @@ TEST(fixadd, AddsAndSaturates) {
         {-0x8000, 0x18000, ok(ONE)},
         {HIGHEST, 0, ok(HIGHEST)},
         {HIGHEST, 1, range_error(HIGHEST)},
+        {1, HIGHEST, range_error(HIGHEST)},
         {0x40000000, 0x40000000, range_error(HIGHEST)},
         {HIGHEST, HIGHEST, range_error(HIGHEST)},
         {LOWEST, -1, ok(INT_MIN)},  // one below what an overflow gives
         {LOWEST, -2, range_error(LOWEST)},
+        {-1, INT_MIN, range_error(LOWEST)},
+        {INT_MIN, -1, range_error(LOWEST)},
         {INT_MIN, INT_MIN, range_error(LOWEST)},  // the sum wraps to 0
         {HIGHEST, INT_MIN, ok(-1)},
     };
@@ -264,9 +267,12 @@ TEST(fixsub, SubtractsAndSaturates) {
         {0x40000000, -0x3FFFFFFF, ok(HIGHEST)},
         {0x40000000, -0x40000000, range_error(HIGHEST)},
         {1, INT_MIN, range_error(HIGHEST)},
+        {HIGHEST, -1, range_error(HIGHEST)},
         {-0x40000000, 0x40000000, ok(INT_MIN)},
         {-0x40000001, 0x40000000, range_error(LOWEST)},
         {INT_MIN, 1, range_error(LOWEST)},
+        {-1, HIGHEST, ok(INT_MIN)},
+        {-2, HIGHEST, range_error(LOWEST)},
         {INT_MIN, INT_MIN, ok(0)},
     };
     check(fixsub, cases);
@@ -396,6 +402,13 @@ TEST(fixatan, GivesTheLastEntryLookedAtAndNotTheNearest) {
     EXPECT_EQ(fixatan(_tan_tbl[63] + 1), 0x200000);  // though entry 63 is nearer than 64
     EXPECT_EQ(fixatan(16384), 20 * 0x8000);          // between entries 19 and 20
     EXPECT_EQ(fixatan(-1), -0x8000);                 // unlike fixatan(1)
+}
+
+TEST(fixatan, LooksForZeroInTheFirstHalfOfTheTable) {
+    const int32_t middle = _tan_tbl[127];
+    _tan_tbl[127] = 0;  // where a search of the whole table would begin
+    EXPECT_EQ(fixatan(0), 0);
+    _tan_tbl[127] = middle;
 }
 
 TEST(fixatan, EndsOneEntryShortOfAQuarterTurnOnOneSideOnly) {
