@@ -12,6 +12,7 @@ struct {
     int nth;
     failing_allocations::extent how_long;
     int asked;
+    int freed;
     size_t bytes;
 } plan;
 
@@ -29,12 +30,14 @@ bool fails(size_t bytes) {
 
 failing_allocations::failing_allocations(int nth, extent how_long) {
     if (plan.active) throw std::logic_error("allocations fail by another plan already");
-    plan = {true, nth, how_long, 0, 0};
+    plan = {true, nth, how_long, 0, 0, 0};
 }
 
 failing_allocations::~failing_allocations() { plan.active = false; }
 
 int failing_allocations::asked() const { return plan.asked; }
+
+int failing_allocations::freed() const { return plan.freed; }
 
 size_t failing_allocations::bytes() const { return plan.bytes; }
 
@@ -59,11 +62,30 @@ void* operator new[](size_t size, const std::nothrow_t&) noexcept {
 
 extern "C" {
 
-void* __real_calloc(size_t count, size_t size);  // NOLINT: the linker's name for calloc
-void* __wrap_calloc(size_t count, size_t size);  // NOLINT: what the linker makes of calloc
+// The linker's names for a function, and for what calls to it become. NOLINTBEGIN
+void* __real_calloc(size_t count, size_t size);
+void* __wrap_calloc(size_t count, size_t size);
+void* __real_malloc(size_t size);
+void* __wrap_malloc(size_t size);
+void* __real_realloc(void* block, size_t size);
+void* __wrap_realloc(void* block, size_t size);
+void __real_free(void* block);
+void __wrap_free(void* block);
+// NOLINTEND
 
 void* __wrap_calloc(size_t count, size_t size) {
     return fails(count * size) ? nullptr : __real_calloc(count, size);
+}
+
+void* __wrap_malloc(size_t size) { return fails(size) ? nullptr : __real_malloc(size); }
+
+void* __wrap_realloc(void* block, size_t size) {
+    return fails(size) ? nullptr : __real_realloc(block, size);
+}
+
+void __wrap_free(void* block) {
+    if (plan.active && block) ++plan.freed;
+    __real_free(block);
 }
 
 // Under AddressSanitizer, sizes that no machine has yield null too instead of ending the program.

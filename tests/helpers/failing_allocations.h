@@ -1,8 +1,9 @@
-// Makes the library run out of memory at a chosen allocation.
+// Counts the library's allocations, and makes it run out of memory at a chosen one.
 //
 // The test program brings its own operator new(nothrow) and new[](nothrow), which the engine's
-// buffers come from, and is linked with --wrap=calloc, which the region passes' work buffers come
-// from. Both count here, in one row; all other allocations are left alone.
+// buffers come from, and is linked so that calloc, which the region passes' work buffers come from,
+// malloc, realloc and free pass by here. All count in one row; what the C++ library's own binary
+// allocates is left alone.
 #pragma once
 
 #include <cstddef>
@@ -20,6 +21,9 @@ public:
 
     // Allocations asked for since this object was made, those that failed included.
     int asked() const;
+
+    // Blocks given to free since then, null ones left out.
+    int freed() const;
 
     // Bytes that they asked for, all in all.
     size_t bytes() const;

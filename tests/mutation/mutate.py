@@ -99,8 +99,8 @@ function(add_header_tests stem)
   list(TRANSFORM ARGN PREPEND ${PROJECT_SOURCE_DIR}/ OUTPUT_VARIABLE tests)
   add_executable(${stem}_tests EXCLUDE_FROM_ALL ${tests} ${helpers})
   target_compile_options(${stem}_tests PRIVATE -O0)
-  target_link_options(${stem}_tests PRIVATE LINKER:--wrap=calloc)
-  target_link_libraries(${stem}_tests PRIVATE draventa_core GTest::gmock GTest::gtest_main)
+  target_link_libraries(${stem}_tests PRIVATE draventa_core counted_allocations GTest::gmock
+                        GTest::gtest_main)
 endfunction()
 """
 

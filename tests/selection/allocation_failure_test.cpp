@@ -119,11 +119,12 @@ TEST_F(AllocationFailure, StrokesWithoutFillAllocateNothing) {
     EXPECT_EQ(counted.asked(), 0);
 }
 
-TEST_F(AllocationFailure, APassOnRegionsAllocatesOnce) {
+TEST_F(AllocationFailure, APassOnRegionsAllocatesOnceAndFreesIt) {
     for (const int mode : {0, 1, 2, 4, 5}) {
         failing_allocations counted(0);
         stroke(mode, 1);
         EXPECT_EQ(counted.asked(), 1) << "mode " << mode;
+        EXPECT_EQ(counted.freed(), 1) << "mode " << mode;
     }
 }
 
