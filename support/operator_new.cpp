@@ -1,5 +1,5 @@
-// The library's own operator new and delete. They stay inside it: the C++ runtime's would bring the
-// machinery of exceptions along, three times the size of the rest, to throw what nobody throws here.
+// The library's own operator new and delete, hidden inside it. The C++ runtime's would bring the
+// machinery of exceptions along, more code than the rest, to throw what nobody throws here.
 
 #include <cstdlib>
 #include <new>
