@@ -12,7 +12,7 @@ import sys
 import tempfile
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
-COMMITTED_ABI = pathlib.Path(__file__).with_name("draventaUtil.abi")
+COMMITTED_ABI = pathlib.Path(__file__).with_name("abi")
 SIZES = ROOT / "docs" / "size.md"
 SONAME = "libdraventaUtil.so"
 PAGE = 16 * 1024  # the larger of the page sizes that Android's phones have
@@ -34,9 +34,13 @@ def output_of(*command):
 # --- one library ---------------------------------------------------------------------------------
 # Each check returns "" or what is wrong.
 
+def listed_exports():
+    return {line for line in (ROOT / "exports.txt").read_text().splitlines()
+            if line and not line.startswith("#")}
+
+
 def check_exports(library):
-    listed = {line for line in (ROOT / "exports.txt").read_text().splitlines()
-              if line and not line.startswith("#")}
+    listed = listed_exports()
     found = {line.split()[0] for line in
              output_of("nm", "-D", "--defined-only", "--format=posix", library).splitlines()}
     return " ".join([f"+{name}" for name in sorted(found - listed)]
@@ -120,19 +124,51 @@ def check_branch_protection(objects):
 
 # --- ABI, bytes, size ----------------------------------------------------------------------------
 
-def check_abi(debug_library, update):
-    """Compares types and functions with the committed dump; needs a library with debug info."""
-    with tempfile.TemporaryDirectory() as folder:
-        dump = pathlib.Path(folder) / "now.abi"
+def dump_abi(objects, folder):
+    """Describes what each object exports, and its types, in a file of its own.
+
+    Not the whole library at once: abidw drops a function that another source declares.
+    """
+    for o in sorted(pathlib.Path(objects).rglob("*.o")):
+        dump = folder / f"{o.stem}.abi"
         output_of("abidw", "--no-corpus-path", "--no-comp-dir-path", "--no-show-locs",
                   "--drop-private-types", "--headers-dir", ROOT / "selection", "--headers-dir",
-                  ROOT / "support", "--out-file", dump, debug_library)
+                  ROOT / "support", "--out-file", dump, o)
         dump.write_text(dump.read_text().replace(f"{ROOT}/", ""))  # wherever it was built
+
+
+def check_described(folder):
+    """That the type of every exported name is described."""
+    described = set()
+    for dump in folder.glob("*.abi"):
+        described.update(re.findall(r"elf-symbol-id='([^']*)'", dump.read_text()))
+    # A constructor's first name is an alias of its second; so is a destructor's.
+    missing = {name for name in listed_exports()
+               if name not in described and re.sub(r"(?<=[CD])1(?=E)", "2", name) not in described}
+    return " ".join(sorted(missing))
+
+
+def check_abi(objects, update):
+    """Compares functions, variables and their types with the committed description."""
+    with tempfile.TemporaryDirectory() as temporary:
+        now = pathlib.Path(temporary)
+        dump_abi(objects, now)
+        wrong = check_described(now)
+        if wrong:
+            return f"not described: {wrong}"
         if update:
-            shutil.copy(dump, COMMITTED_ABI)
-        result = subprocess.run(["abidiff", COMMITTED_ABI, dump], stdout=subprocess.PIPE,
-                                stderr=subprocess.STDOUT, text=True)
-    return "" if result.returncode == 0 else result.stdout.strip()
+            shutil.rmtree(COMMITTED_ABI, ignore_errors=True)
+            shutil.copytree(now, COMMITTED_ABI)
+        changes = []
+        for name in sorted({d.name for f in (now, COMMITTED_ABI) for d in f.glob("*.abi")}):
+            if not (now / name).exists() or not (COMMITTED_ABI / name).exists():
+                changes.append(f"{name} is new or gone")
+                continue
+            result = subprocess.run(["abidiff", COMMITTED_ABI / name, now / name],
+                                    stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)
+            if result.returncode != 0:
+                changes.append(f"{name}:\n{result.stdout.strip()}")
+    return "\n".join(changes)
 
 
 def check_twins(one, two):
@@ -188,7 +224,8 @@ def main():
                         metavar="ARCH=FILE")
     parser.add_argument("--protected", metavar="DIR",
                         help="folder of objects that must have AArch64's branch protection")
-    parser.add_argument("--debug-library", metavar="FILE", help="with debug info, for the ABI")
+    parser.add_argument("--debug-objects", metavar="DIR",
+                        help="folder of objects with debug info, for the ABI")
     parser.add_argument("--twins", nargs=2, action="append", default=[], metavar="FILE",
                         help="two builds of the same library")
     parser.add_argument("--update", action="store_true", help="commit ABI and sizes as they are")
@@ -202,8 +239,8 @@ def main():
     if arguments.protected:
         results.append(("aarch64: branch protection in every object",
                         check_branch_protection(arguments.protected)))
-    if arguments.debug_library:
-        results.append(("ABI as committed", check_abi(arguments.debug_library, arguments.update)))
+    if arguments.debug_objects:
+        results.append(("ABI as committed", check_abi(arguments.debug_objects, arguments.update)))
     for one, two in arguments.twins:
         results.append((f"same bytes twice: {one}", check_twins(one, two)))
     results.append(("sizes of docs/size.md", check_sizes(arguments.library, arguments.update)))
