@@ -1,6 +1,7 @@
 #include "tests/helpers/failing_allocations.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <cstdlib>
 #include <new>
 #include <stdexcept>
@@ -41,28 +42,21 @@ int failing_allocations::freed() const { return plan.freed; }
 
 size_t failing_allocations::bytes() const { return plan.bytes; }
 
-// Through the throwing forms, so that the ordinary delete takes the memory back.
-void* operator new(size_t size, const std::nothrow_t&) noexcept {
-    if (fails(size)) return nullptr;
-    try {
-        return ::operator new(size);
-    } catch (const std::bad_alloc&) {
-        return nullptr;
-    }
-}
-
-void* operator new[](size_t size, const std::nothrow_t&) noexcept {
-    if (fails(size)) return nullptr;
-    try {
-        return ::operator new[](size);
-    } catch (const std::bad_alloc&) {
-        return nullptr;
-    }
-}
-
+// The linker's names for a function, and for what calls to it become. Those of operator new depend
+// on what size_t is. NOLINTBEGIN
+#if SIZE_MAX == UINT32_MAX
+#define REAL(what) __real__##what##jRKSt9nothrow_t
+#define WRAP(what) __wrap__##what##jRKSt9nothrow_t
+#else
+#define REAL(what) __real__##what##mRKSt9nothrow_t
+#define WRAP(what) __wrap__##what##mRKSt9nothrow_t
+#endif
 extern "C" {
 
-// The linker's names for a function, and for what calls to it become. NOLINTBEGIN
+void* REAL(Znw)(size_t size, const std::nothrow_t& tag);
+void* WRAP(Znw)(size_t size, const std::nothrow_t& tag);
+void* REAL(Zna)(size_t size, const std::nothrow_t& tag);
+void* WRAP(Zna)(size_t size, const std::nothrow_t& tag);
 void* __real_calloc(size_t count, size_t size);
 void* __wrap_calloc(size_t count, size_t size);
 void* __real_malloc(size_t size);
@@ -72,6 +66,14 @@ void* __wrap_realloc(void* block, size_t size);
 void __real_free(void* block);
 void __wrap_free(void* block);
 // NOLINTEND
+
+void* WRAP(Znw)(size_t size, const std::nothrow_t& tag) {
+    return fails(size) ? nullptr : REAL(Znw)(size, tag);
+}
+
+void* WRAP(Zna)(size_t size, const std::nothrow_t& tag) {
+    return fails(size) ? nullptr : REAL(Zna)(size, tag);
+}
 
 void* __wrap_calloc(size_t count, size_t size) {
     return fails(count * size) ? nullptr : __real_calloc(count, size);
@@ -88,8 +90,12 @@ void __wrap_free(void* block) {
     __real_free(block);
 }
 
-// Under AddressSanitizer, sizes that no machine has yield null too instead of ending the program.
-const char* __asan_default_options();  // NOLINT: the sanitizer's name
+// Under the sanitizers, sizes that no machine has yield null too instead of ending the program.
+// NOLINTBEGIN: their names
+const char* __asan_default_options();
 const char* __asan_default_options() { return "allocator_may_return_null=1"; }
+const char* __msan_default_options();
+const char* __msan_default_options() { return "allocator_may_return_null=1"; }
+// NOLINTEND
 
 }  // extern "C"

@@ -1,9 +1,9 @@
 // Counts the library's allocations, and makes it run out of memory at a chosen one.
 //
-// The test program brings its own operator new(nothrow) and new[](nothrow), which the engine's
-// buffers come from, and is linked so that calloc, which the region passes' work buffers come from,
-// malloc, realloc and free pass by here. All count in one row; what the C++ library's own binary
-// allocates is left alone.
+// The test program is linked so that the library's calls of operator new(nothrow) and
+// new[](nothrow), which the engine's buffers come from, of calloc, which the region passes' work
+// buffers come from, and of malloc, realloc and free pass by here. All count in one row; what the
+// C++ library's own binary allocates is left alone.
 #pragma once
 
 #include <cstddef>
