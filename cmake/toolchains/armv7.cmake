@@ -3,6 +3,6 @@
 set(CMAKE_SYSTEM_NAME Linux)
 set(CMAKE_SYSTEM_PROCESSOR armv7)
 set(DRAVENTA_TRIPLET arm-linux-gnueabi)
-set(CMAKE_CXX_FLAGS_INIT "-march=armv7-a -mfpu=neon -mfloat-abi=softfp -mthumb")
+set(CMAKE_CXX_FLAGS_INIT "-march=armv7-a -mfpu=neon -mfloat-abi=softfp -mthumb -Wno-psabi")
 set(CMAKE_CROSSCOMPILING_EMULATOR qemu-arm -L /usr/arm-linux-gnueabi)
 include(${CMAKE_CURRENT_LIST_DIR}/cross.cmake)

@@ -170,7 +170,7 @@ void check_placements(const family& f, uint64_t cases) {
 
 void print_digest(const family& f, uint64_t share) {
     const uint64_t cases = (f.digest_cases + share - 1) / share;
-    check_placements(f, (cases + 15) / 16);
+    check_placements(f, (f.digest_cases + 255) / 256);
     findings found;
     for (uint64_t n = 0; n < cases; ++n) {
         const uint64_t seed = case_seed(DIGEST_SEED, f, n);
