@@ -198,7 +198,7 @@ def check_sizes(libraries, update):
         SIZES.write_text(
             "# Size of the library\n\n"
             "Release build by g++, stripped. Bytes of the file (its segments are aligned to 16 KiB\n"
-            "on 64-bit machines), of code and constants, and of data. Two thirds of the data are\n"
+            "on 64-bit machines), of code and constants, and of data, most of which are\n"
             "the tables of the fixed-point toolkit. `./dev binary` measures, and fails when a file\n"
             "has grown by more than a tenth; `./dev binary --update` rewrites this page.\n\n"
             "| processor | file | code and constants | data |\n|---|---:|---:|---:|\n" + rows)
