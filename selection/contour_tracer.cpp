@@ -21,13 +21,12 @@ bool contains(const ze_rect& box, int x, int y) {
     return x >= box.left && x <= box.right && y >= box.top && y <= box.bottom;
 }
 
-// One byte per position from (-1, -1) to (width, height), or 0 for sizes that make no buffer.
+}  // namespace
+
 size_t marker_bytes(int width, int height) {
     const int64_t bytes = (int64_t{width} + 2) * (int64_t{height} + 2);
     return bytes < 0 || bytes > PTRDIFF_MAX ? 0 : static_cast<size_t>(bytes);
 }
-
-}  // namespace
 
 marker_buffer::marker_buffer(int mask_width, int mask_height)
     : width(mask_width),

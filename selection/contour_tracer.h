@@ -8,21 +8,13 @@
 
 #include <cstddef>
 
+#include "selection/value_set.h"
 #include "selection/ze_rect.h"
 
 constexpr unsigned char BACKGROUND_MARKER = 5;
 
-// A set of mask values.
-class value_set {
-public:
-    template <class... Values>
-    constexpr explicit value_set(Values... values) : bits((0u | ... | (1u << values))) {}
-
-    constexpr bool has(unsigned char value) const { return value < 32 && (bits >> value & 1) != 0; }
-
-private:
-    unsigned bits;
-};
+// Bytes of the markers of an image, or 0 for sizes that make no buffer.
+size_t marker_bytes(int width, int height);
 
 // The markers of one pass: a byte for each pixel position (x, y) with x from -1 to width and y from
 // -1 to height, zero at first.

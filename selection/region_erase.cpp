@@ -1,112 +1,95 @@
 #include <cstdint>
 
-#include "selection/contour_tracer.h"
+#include "selection/interior_pass.h"
+#include "selection/region_bits.h"
 #include "selection/region_shaping.h"
+
+// The erasing pass; region_plain.cpp has it pixel by pixel.
 
 namespace {
 
 constexpr unsigned char SELECTED = 1;
-constexpr unsigned char VISITED = 2;  // by the counting scan; erased in the end unless restored
 
-const value_set REGION(SELECTED, VISITED);
+// In the end a pixel that the mask starts with as visited is selected or erased like any other.
+constexpr region_values SELECTION = {value_set(SELECTED, VISITED_VALUE), value_set(VISITED_VALUE),
+                                     SELECTED};
 
-// Marks the interior of the region traced last and returns how many pixels that turned from
-// selected to visited. Contour pixels are visited already and do not count.
-//
-// Deliberate: `inside` carries over from the end of a row to the start of the next, and a contour
-// pixel with a marker on its left stays inside whatever is on its right, so that counts depend on
-// what else lies in the union of the contours.
-int64_t count_interior(const region_mask& mask, const marker_buffer& markers) {
-    const ze_rect area = mask.contours;
+// Makes visited what lies inside the region traced last, and counts it.
+struct counting {
+    // Deliberate: so counts depend on what else lies in the area of the contours.
+    static constexpr bool CROSSES_ROWS = true;
+
+    // Deliberate: a contour pixel with a marker on its left stays inside whatever is on its right.
+    static flag_events events(bit_word visited, bit_word marked_left, bit_word marked_right) {
+        return {visited & marked_left, visited & ~marked_left & marked_right};
+    }
+
+    bit_word turn(region_bits* bits, word_place at, bit_word inside) {
+        const bit_word turned = inside & bits->member(at) & ~bits->visited(at);
+        if (turned == 0) return 0;
+        bits->visited(at) |= turned;
+        count += __builtin_popcountll(turned);
+        return turned;
+    }
+
     int64_t count = 0;
-    bool inside = false;
-    for (int y = area.top; y <= area.bottom; ++y) {
-        for (int x = area.left; x <= area.right; ++x) {
-            unsigned char& pixel = mask.at(x, y);
-            if (pixel == VISITED) {
-                if (markers.on_left_of(x, y)) {
-                    inside = true;
-                } else if (markers.on_right_of(x, y)) {
-                    inside = false;
-                }
-            } else if (inside && pixel == SELECTED) {
-                pixel = VISITED;
-                ++count;
-            }
-        }
-    }
-    return count;
-}
+};
 
-// Makes the interior of the survivor, whose contour is SELECTED again, selected again.
+// Makes the interior of the survivor, whose contour is unvisited again, unvisited.
 //
-// Deliberate: `inside` carries over from row to row here too, but a marker on the right ends it.
-void restore_interior(const region_mask& mask, const marker_buffer& markers, ze_rect* boundary) {
-    const ze_rect area = mask.contours;
+// Deliberate: the flag goes on from row to row here too, but a marker on the right clears it.
+void restore_interior(region_bits* bits) {
+    const ze_rect area = bits->contours;
     bool inside = false;
-    for (int y = area.top; y <= area.bottom; ++y) {
-        for (int x = area.left; x <= area.right; ++x) {
-            unsigned char& pixel = mask.at(x, y);
-            if (pixel == SELECTED) {
-                if (markers.on_left_of(x, y)) inside = true;
-                if (markers.on_right_of(x, y)) inside = false;
-            } else if (inside && pixel == VISITED) {
-                pixel = SELECTED;
-                include(boundary, x, y);
-            }
-        }
-    }
-}
-
-// Gives every visited pixel of the box its final value. Widens `visited` over those, and
-// `selected`, where there is one, over the selected.
-void settle_visited(const region_mask& mask, unsigned char value, ze_rect* visited,
-                    ze_rect* selected) {
-    for (int y = mask.box.top; y <= mask.box.bottom; ++y) {
-        for (int x = mask.box.left; x <= mask.box.right; ++x) {
-            unsigned char& pixel = mask.at(x, y);
-            if (pixel == VISITED) {
-                pixel = value;
-                include(visited, x, y);
-            } else if (selected && pixel == SELECTED) {
-                include(selected, x, y);
-            }
-        }
-    }
+    bits->for_each_occupied(area, [&](word_place at) {
+        const bit_word here = cells_between(area.left, area.right, at.word);
+        const bit_word contour = bits->member(at) & ~bits->visited(at) & here;
+        const bit_word right = bits->marked_right(at);
+        const flag_events events =
+            bits->marked.has(at)
+                ? flag_events{contour & bits->marked_left(at) & ~right, contour & right}
+                : flag_events{0, 0};
+        bits->visited(at) &= ~(events.inside(inside) & here);
+        if (!events.none()) inside = events.last();
+    });
 }
 
 }  // namespace
 
-void Erase_Region(unsigned char* cells, int width, int height, ze_rect* boundary, ze_rect* rect) {
-    const ze_rect box = clip_to_image(*boundary, width, height);
+void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary, ze_rect* rect) {
+    const ze_rect box = *boundary;
     *boundary = empty_beyond_image(width, height);
-    marker_buffer markers(width, height);
-    if (!markers) return;
-    region_mask mask(cells, width, height, box);
+    region_bits bits(mask, width, height, box, SELECTION);
+    if (!bits) return;
 
+    counting counted;
+    interior_pass<counting> interiors(&bits, &counted);
     int64_t regions = 0;
     int64_t best_count = 0;
-    int best_x = -1;
-    int best_y = -1;
-    for (int y = box.top; y <= box.bottom; ++y) {
-        for (int x = box.left; x <= box.right; ++x) {
-            if (mask.at(x, y) != SELECTED) continue;
-            trace_contour(&mask, &markers, x, y, REGION, VISITED);
-            const int64_t count = count_interior(mask, markers);
-            if (best_count <= count) {
-                best_count = count;
-                best_x = x;
-                best_y = y;
-            }
-            ++regions;
+    cell best = {0, 0};
+    bits.for_each_unvisited([&](cell start) {
+        bits.trace(start, [&bits](cell c) { bits.set_visited(c); });
+        counted.count = 0;
+        interiors.run();
+        if (best_count <= counted.count) {
+            best_count = counted.count;
+            best = start;
         }
-    }
+        ++regions;
+    });
     if (regions <= 1) {
-        settle_visited(mask, SELECTED, boundary, nullptr);
+        bits.for_each_occupied(bits.all_cells(), [&](word_place at) {
+            bits.include_bits(boundary, at, bits.member(at));
+        });
         return;
     }
-    markers.clear();
-    trace_contour(&mask, &markers, best_x, best_y, REGION, SELECTED);
-    restore_interior(mask, markers, boundary);
-    settle_visited(mask, 0, rect, boundary);
+    bits.clear_markers();
+    bits.trace(best, [&bits](cell c) { bits.set_unvisited(c); });
+    restore_interior(&bits);
+    bits.for_each_occupied(bits.all_cells(), [&](word_place at) {
+        const bit_word erased = bits.visited(at);
+        bits.include_bits(rect, at, erased);
+        bits.include_bits(boundary, at, bits.member(at) & ~erased);
+        bits.write(at, erased, 0);
+    });
 }

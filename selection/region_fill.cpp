@@ -1,72 +1,61 @@
 #include "selection/contour_tracer.h"
+#include "selection/interior_pass.h"
 #include "selection/lasso_values.h"
+#include "selection/region_bits.h"
 #include "selection/region_shaping.h"
+
+// The filling passes; region_plain.cpp has them pixel by pixel.
 
 namespace {
 
-// Mask value of contour and interior during a pass.
-constexpr unsigned char VISITED = 2;
+// A visited pixel is never looked at as a pixel again, so its final value is written to the mask as
+// soon as it is known: for those that the mask starts with, when the bits are made, and for those
+// filled, when they are. Contour pixels of a selection hold it already.
+constexpr region_values HOLES = {value_set(1, VISITED_VALUE), value_set(VISITED_VALUE), 1};
 
-// What sets the filling passes apart.
-struct fill_rules {
-    value_set starts;           // values at which the scan begins a region
-    value_set region;           // values that belong to it
-    value_set replaced;         // values that the end of the pass turns into ...
-    unsigned char replacement;  // ... this one
-};
-
-constexpr fill_rules HOLES = {value_set(1), value_set(1, VISITED), value_set(VISITED), 1};
-
-constexpr fill_rules ADDING_LASSO = {value_set(ADDED_NEW, ADDED_OVER),
-                                     value_set(ADDED_NEW, ADDED_OVER, VISITED),
-                                     value_set(ADDED_OVER, VISITED), 1};
+constexpr region_values ADDING_LASSO = {value_set(ADDED_NEW, ADDED_OVER, VISITED_VALUE),
+                                        value_set(ADDED_OVER, VISITED_VALUE), 1};
 
 // The selection is no region here: the fill reaches it from the outline around it.
-constexpr fill_rules REMOVING_LASSO = {value_set(REMOVED_OTHER, REMOVED_SELECTED),
-                                       value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED),
-                                       value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED), 0};
+constexpr region_values REMOVING_LASSO = {value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED_VALUE),
+                                          value_set(REMOVED_OTHER, REMOVED_SELECTED, VISITED_VALUE),
+                                          0};
 
-// Sets what lies between left and right contour pixels to VISITED. Widens `filled`, where there is
-// one, over pixels that were 0.
-void fill_interiors(const region_mask& mask, const marker_buffer& markers, ze_rect* filled) {
-    const ze_rect area = mask.contours;
-    for (int y = area.top; y <= area.bottom; ++y) {
-        bool inside = false;
-        for (int x = area.left; x <= area.right; ++x) {
-            unsigned char& pixel = mask.at(x, y);
-            if (pixel == VISITED) {
-                if (markers.on_left_of(x, y)) inside = true;
-                if (markers.on_right_of(x, y)) inside = false;
-            } else if (inside) {
-                if (filled && pixel == 0) include(filled, x, y);
-                pixel = VISITED;
-            }
-        }
-    }
-}
+// Makes visited what lies between left and right contour pixels.
+struct filling {
+    static constexpr bool CROSSES_ROWS = false;
 
-void replace_values(const region_mask& mask, value_set replaced, unsigned char replacement) {
-    for (int y = mask.box.top; y <= mask.box.bottom; ++y) {
-        for (int x = mask.box.left; x <= mask.box.right; ++x) {
-            if (replaced.has(mask.at(x, y))) mask.at(x, y) = replacement;
-        }
+    static flag_events events(bit_word visited, bit_word marked_left, bit_word marked_right) {
+        return {visited & marked_left & ~marked_right, visited & marked_right};
     }
-}
+
+    bit_word turn(region_bits* bits, word_place at, bit_word inside) const {
+        const bit_word filled = inside & ~bits->visited(at);
+        if (filled == 0) return 0;
+        const bit_word joining = filled & ~bits->member(at);
+        bits->visited(at) |= filled;
+        if (joining == 0) return filled;
+        bits->member(at) |= joining;
+        if (changed) bits->include_bits(changed, at, bits->with_value(at, joining, 0));
+        bits->write(at, joining, value);
+        return filled;
+    }
+
+    unsigned char value;
+    ze_rect* changed;  // widened over pixels that were 0; may be null
+};
 
 // Runs one filling pass. Returns 0 when the work buffer cannot be had, otherwise 1.
-int fill_regions(const fill_rules& rules, unsigned char* cells, int width, int height,
-                 const ze_rect& box, ze_rect* filled) {
-    marker_buffer markers(width, height);
-    if (!markers) return 0;
-    region_mask mask(cells, width, height, clip_to_image(box, width, height));
-    for (int y = mask.box.top; y <= mask.box.bottom; ++y) {
-        for (int x = mask.box.left; x <= mask.box.right; ++x) {
-            if (!rules.starts.has(mask.at(x, y))) continue;
-            trace_contour(&mask, &markers, x, y, rules.region, VISITED);
-            fill_interiors(mask, markers, filled);
-        }
-    }
-    replace_values(mask, rules.replaced, rules.replacement);
+int fill_regions(const region_values& values, unsigned char* mask, int width, int height,
+                 const ze_rect& box, ze_rect* changed) {
+    region_bits bits(mask, width, height, box, values);
+    if (!bits) return 0;
+    filling rules = {values.replacement, changed};
+    interior_pass<filling> interiors(&bits, &rules);
+    bits.for_each_unvisited([&](cell start) {
+        bits.trace(start, [&bits](cell c) { bits.set_visited(c); });
+        interiors.run();
+    });
     return 1;
 }
 

@@ -1,7 +1,10 @@
 // Passes on whole regions of a selection mask. Each traces the contours of the regions inside a box
-// (contour_tracer.h) and works on what they enclose.
+// and works on what they enclose. region_plain.cpp says pixel by pixel what they do; here the same
+// is done on bits (region_bits.h), going over what is new since the region before
+// (interior_pass.h).
 //
-// A pass takes one work buffer of about a byte per pixel and frees it before it returns.
+// A pass takes one work buffer and frees it before it returns: three bits for each pixel of the
+// box, in words of 64, and four words for each row.
 #pragma once
 
 #include "selection/ze_rect.h"

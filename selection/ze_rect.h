@@ -20,6 +20,10 @@ static_assert(sizeof(ze_rect) == 4 * sizeof(int) && offsetof(ze_rect, right) == 
                   offsetof(ze_rect, top) == 2 * sizeof(int),
               "callers lay the rectangle out as left, right, top, bottom");
 
+inline bool operator==(const ze_rect& a, const ze_rect& b) {
+    return a.left == b.left && a.right == b.right && a.top == b.top && a.bottom == b.bottom;
+}
+
 // The two empty forms.
 //
 // Deliberate: object and fill box start at the last column and row, stroke rectangles and rebuilt
