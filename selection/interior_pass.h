@@ -104,8 +104,10 @@ private:
 
     bool flag_before(word_place at) const {
         if (at.word > first_word()) return bits.flags.has({at.row, at.word - 1});
-        return Rules::CROSSES_ROWS && at.row > area.top &&
-               bits.flags.has({at.row - 1, last_word()});
+        if constexpr (Rules::CROSSES_ROWS) {
+            if (at.row > area.top) return bits.flags.has({at.row - 1, last_word()});
+        }
+        return false;
     }
 
     // Passes `at` and the words behind it until the flag is what it was when they were passed
@@ -133,7 +135,7 @@ private:
             }
             if (++at.word > last_word()) {
                 at = {at.row + 1, first_word()};
-                changed = changed && Rules::CROSSES_ROWS;
+                if constexpr (!Rules::CROSSES_ROWS) return at;
             }
         }
         return at;

@@ -7,6 +7,7 @@
 #include <random>
 
 #include "selection/region_shaping.h"
+#include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"
 #include "tests/helpers/rect_printing.h"
 
@@ -161,4 +162,24 @@ TEST(RegionPasses, WorkOnRowsOfThousandsOfPixels) {
         run_erase(&plain::Erase_Region, &plainly_erased);
         EXPECT_TRUE(erased == plainly_erased) << width;
     }
+}
+
+TEST(PlainRegionPasses, DoNothingWithoutAWorkBuffer) {
+    const Picture ring("5#5 #.# 5#5");
+    const outcome before = {ring, {3, 0, 3, 0}, {0, 2, 0, 2}, 7};
+    outcome filled = before, erased = before, lassoed = before;
+    const failing_allocations out_of_memory(1, failing_allocations::FROM_THEN_ON);
+    run_fill(&plain::Fill_Region, &filled);
+    EXPECT_EQ(filled, before);
+    run_erase(&plain::Erase_Region, &erased);
+    EXPECT_EQ(erased, (outcome{ring, {3, 0, 3, 0}, {3, 0, 3, 0}, 7}));
+    run_lasso(&plain::ze_lasso_add_fill_mask, &lassoed);
+    EXPECT_EQ(lassoed, (outcome{ring, {3, 0, 3, 0}, {0, 2, 0, 2}, 0}));
+}
+
+// Their buffer would have (width + 2) * (height + 2) bytes.
+TEST(PlainRegionPasses, HaveNoWorkBufferForSizesOfUnlikeSign) {
+    unsigned char pixel = 5;
+    EXPECT_EQ(plain::ze_lasso_add_fill_mask(&pixel, -5, 4, 0, 0, 0, 0), 0);
+    EXPECT_EQ(pixel, 5);
 }
