@@ -30,16 +30,10 @@ struct flag_events {
 
     // The cells with the flag set, when it was `before` in front of the word.
     bit_word inside(bool before) const {
-        if (none()) return before ? ~bit_word{0} : 0;
-        // Each cell takes over from those below it what none between has cleared; twice as far at
-        // every step.
-        bit_word flags = set | (before ? ~cleared & 1 : 0);
-        bit_word keeps = ~cleared;
-        for (int distance = 1; distance < WORD_BITS; distance *= 2) {
-            flags |= keeps & flags << distance;
-            keeps &= keeps << distance;
-        }
-        return flags;
+        // Adding a bit to a run of ones carries it through to the run's end, so where ones are what
+        // is not cleared, the sum differs from there on, but for further set bits on the way.
+        const bit_word start = set | (before ? ~cleared & 1 : 0);
+        return (~cleared & ~(~cleared + start)) | start;
     }
 };
 
@@ -67,8 +61,8 @@ public:
     }
 
 private:
-    int first_word() const { return area.left / WORD_BITS; }
-    int last_word() const { return area.right / WORD_BITS; }
+    int first_word() const { return word_with(area.left); }
+    int last_word() const { return word_with(area.right); }
 
     // The bits of a word's cells in the area.
     bit_word in_area(int word) const { return cells_between(area.left, area.right, word); }
@@ -85,7 +79,7 @@ private:
             }
             touch_members(row, area.left, covered.left - 1);
             touch_members(row, covered.right + 1, area.right);
-            const word_place end = {row, covered.right / WORD_BITS};
+            const word_place end = {row, word_with(covered.right)};
             if ((wider || row == covered.bottom) && bits.flags.has(end)) {
                 bits.flags.erase(end);  // so that it is handed on again
                 bits.touch(end);
@@ -96,7 +90,7 @@ private:
 
     void touch_members(int row, int first, int last) {
         if (first > last) return;
-        for (int word = first / WORD_BITS; word <= last / WORD_BITS; ++word) {
+        for (int word = word_with(first); word <= word_with(last); ++word) {
             const bit_word members = bits.member({row, word}) & cells_between(first, last, word);
             if (members != 0) bits.touch({row, word});
         }
@@ -114,31 +108,50 @@ private:
     // before. Returns the word behind.
     word_place go_on_from(word_place at) {
         bool flag = flag_before(at);
-        for (bool changed = true; changed && at.row <= area.bottom;) {
-            bits.dirty.erase(at);
-            if (bits.marked.has(at)) {
-                const flag_events events =
-                    Rules::events(bits.visited(at) & in_area(at.word), bits.marked_left(at),
-                                  bits.marked_right(at));
-                const bit_word turned =
-                    rules.turn(&bits, at, events.inside(flag) & in_area(at.word));
-                if ((turned & (bits.marked_left(at) | bits.marked_right(at))) != 0) bits.touch(at);
-                if (!events.none()) flag = events.last();
-            } else if (flag) {
-                rules.turn(&bits, at, in_area(at.word));
+        for (;;) {
+            if (flag) at.word = turn_unmarked(at);
+            if (at.word <= last_word()) {
+                bits.dirty.erase(at);
+                if (bits.marked.has(at)) {
+                    flag = pass_marked(at, flag);
+                } else if (flag) {
+                    rules.turn(&bits, at, in_area(at.word));
+                }
+                const bool as_before = bits.flags.has(at) == flag;
+                bits.flags.set(at, flag);
+                ++at.word;
+                if (as_before) return at;
             }
-            changed = bits.flags.has(at) != flag;
-            if (flag) {
-                bits.flags.insert(at);
-            } else {
-                bits.flags.erase(at);
-            }
-            if (++at.word > last_word()) {
+            if (at.word > last_word()) {
                 at = {at.row + 1, first_word()};
-                if constexpr (!Rules::CROSSES_ROWS) return at;
+                if (!Rules::CROSSES_ROWS || at.row > area.bottom) return at;
             }
         }
-        return at;
+    }
+
+    // Passes the words from `at` to the next in its row with a marker or with the flag set already,
+    // or to the end of the row, the flag being set throughout. Returns that word.
+    int turn_unmarked(word_place at) {
+        const int end =
+            std::min(bits.marked.next(at, last_word() + 1), bits.flags.next(at, last_word() + 1));
+        for (word_place each = at; each.word < end; ++each.word) {
+            rules.turn(&bits, each, in_area(each.word));
+        }
+        bits.flags.insert(at, end);
+        bits.unfinished.erase({at.row, std::max(at.word, first_word() + 1)},
+                              std::min(end, last_word()));
+        return end;
+    }
+
+    // Passes a word with markers, and returns the flag behind it.
+    bool pass_marked(word_place at, bool flag) {
+        const bit_word here = in_area(at.word);
+        const bit_word left = bits.marked_left(at);
+        const bit_word right = bits.marked_right(at);
+        const flag_events events = Rules::events(bits.visited(at) & here, left, right);
+        const bit_word turned = rules.turn(&bits, at, events.inside(flag) & here);
+        if ((turned & (left | right)) != 0) bits.touch(at);
+        return events.none() ? flag : events.last();
     }
 
     region_bits& bits;

@@ -53,19 +53,19 @@ region_bits::region_bits(unsigned char* cells, int mask_width, int height, const
     const int64_t all_rows = int64_t{row_count} + 2;
     const int64_t all_bits = all_rows * row_words;
     const int64_t all_sets = all_rows * set_words;
-    const int64_t bytes = (3 * all_bits + 4 * all_sets + words_for(row_count + 2)) *
+    const int64_t bytes = (3 * all_bits + 5 * all_sets + words_for(row_count + 2)) *
                           static_cast<int64_t>(sizeof(bit_word));
     if (bytes > PTRDIFF_MAX) return;
     members = static_cast<bit_word*>(ze_calloc(static_cast<size_t>(bytes), 1));
     if (!members) return;
     visits = members + all_bits;
     markers = visits + all_bits;
-    bit_word* const sets = markers + all_bits;
-    occupied = word_set(sets, set_words);
-    marked = word_set(sets + all_sets, set_words);
-    dirty = word_set(sets + 2 * all_sets, set_words);
-    flags = word_set(sets + 3 * all_sets, set_words);
-    dirty_rows = sets + 4 * all_sets;
+    bit_word* sets = markers + all_bits;
+    for (word_set* set : {&occupied, &unfinished, &marked, &dirty, &flags}) {
+        *set = word_set(sets, set_words);
+        sets += all_sets;
+    }
+    dirty_rows = sets;
 
     contours = {column_count + 1, 0, row_count + 1, 0};
     read_mask(values);
@@ -86,6 +86,7 @@ void region_bits::read_mask(const region_values& values) {
             if (bits != 0) {
                 member({row, word}) = bits << skipped;
                 occupied.insert({row, word});
+                unfinished.insert({row, word});
             }
             if (visited_bits != 0) visited({row, word}) = visited_bits << skipped;
             read += count;
@@ -144,18 +145,6 @@ void region_bits::mark_sharing(cell c) {
     for (cell other = {c.column + width, c.row - 1}; other.column <= column_count + 1;
          other = {other.column + width, other.row - 1}) {
         set_in_reach(other);
-    }
-}
-
-word_place region_bits::next_dirty(word_place at, const ze_rect& area) {
-    const int first = area.left / WORD_BITS;
-    const int end = area.right / WORD_BITS + 1;
-    for (;;) {
-        at.word = dirty.next(at, end);
-        if (at.word < end) return at;
-        at = {next_bit(dirty_rows, at.row + 1, area.bottom + 1), first};
-        if (at.row > area.bottom) return at;
-        dirty_rows[at.row / WORD_BITS] &= ~(bit_word{1} << at.row % WORD_BITS);
     }
 }
 

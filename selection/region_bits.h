@@ -18,6 +18,14 @@
 using bit_word = uint64_t;
 constexpr int WORD_BITS = 64;
 
+// The word that holds a bit of a row of words, and its place there.
+constexpr int word_with(int bit) {
+    return static_cast<int>(static_cast<unsigned>(bit) / WORD_BITS);
+}
+constexpr int place_in_word(int bit) {
+    return static_cast<int>(static_cast<unsigned>(bit) % WORD_BITS);
+}
+
 constexpr int lowest_bit(bit_word bits) { return __builtin_ctzll(bits); }
 constexpr int highest_bit(bit_word bits) { return WORD_BITS - 1 - __builtin_clzll(bits); }
 constexpr bit_word bits_from(int bit) { return ~bit_word{0} << bit; }
@@ -25,8 +33,8 @@ constexpr bit_word bits_up_to(int bit) { return ~bit_word{0} >> (WORD_BITS - 1 -
 
 // The bits of word number `word` for cells first .. last of a row. REQUIRES: it has some.
 constexpr bit_word cells_between(int first, int last, int word) {
-    return (word == first / WORD_BITS ? bits_from(first % WORD_BITS) : ~bit_word{0}) &
-           (word == last / WORD_BITS ? bits_up_to(last % WORD_BITS) : ~bit_word{0});
+    return (word == word_with(first) ? bits_from(place_in_word(first)) : ~bit_word{0}) &
+           (word == word_with(last) ? bits_up_to(place_in_word(last)) : ~bit_word{0});
 }
 
 // Calls visit(first bit, length) for each run of ones.
@@ -44,8 +52,8 @@ void for_each_run(bit_word bits, Visit visit) {
 
 // The first one at or behind `from` among bits 0 .. end - 1 of a row of words, or `end`.
 inline int next_bit(const bit_word* bits, int from, int end) {
-    for (int bit = from; bit < end; bit += WORD_BITS - bit % WORD_BITS) {
-        const bit_word ahead = bits[bit / WORD_BITS] >> bit % WORD_BITS;
+    for (int bit = from; bit < end; bit += WORD_BITS - place_in_word(bit)) {
+        const bit_word ahead = bits[word_with(bit)] >> place_in_word(bit);
         if (ahead != 0) return std::min(bit + lowest_bit(ahead), end);
     }
     return end;
@@ -64,8 +72,8 @@ struct word_place {
     int word;
 };
 
-inline word_place word_of(cell c) { return {c.row, c.column / WORD_BITS}; }
-inline bit_word bit_of(cell c) { return bit_word{1} << c.column % WORD_BITS; }
+inline word_place word_of(cell c) { return {c.row, word_with(c.column)}; }
+inline bit_word bit_of(cell c) { return bit_word{1} << place_in_word(c.column); }
 
 // A set of words of a box, one bit a word; its memory is the box's.
 class word_set {
@@ -73,9 +81,18 @@ public:
     word_set() = default;
     word_set(bit_word* memory, int words_per_row) : sets(memory), row_words(words_per_row) {}
 
-    bool has(word_place at) const { return (set_of(at) >> at.word % WORD_BITS & 1) != 0; }
-    void insert(word_place at) { set_of(at) |= bit_word{1} << at.word % WORD_BITS; }
-    void erase(word_place at) { set_of(at) &= ~(bit_word{1} << at.word % WORD_BITS); }
+    bool has(word_place at) const { return (set_of(at) & bit_of(at)) != 0; }
+    void insert(word_place at) { set_of(at) |= bit_of(at); }
+    void erase(word_place at) { set_of(at) &= ~bit_of(at); }
+    void set(word_place at, bool in_set) { in_set ? insert(at) : erase(at); }
+
+    // Words from `at` to before `end` in its row.
+    void insert(word_place at, int end) {
+        for_each_set(at, end, [](bit_word* set, bit_word words) { *set |= words; });
+    }
+    void erase(word_place at, int end) {
+        for_each_set(at, end, [](bit_word* set, bit_word words) { *set &= ~words; });
+    }
 
     // The first word of the set at or behind `at` in its row, or `end` when none is before that.
     int next(word_place at, int end) const {
@@ -83,8 +100,17 @@ public:
     }
 
 private:
+    static bit_word bit_of(word_place at) { return bit_word{1} << place_in_word(at.word); }
     bit_word& set_of(word_place at) const {
-        return sets[ptrdiff_t{at.row} * row_words + at.word / WORD_BITS];
+        return sets[ptrdiff_t{at.row} * row_words + word_with(at.word)];
+    }
+
+    template <class Visit>
+    void for_each_set(word_place at, int end, Visit visit) {
+        if (at.word >= end) return;
+        for (int i = word_with(at.word); i <= word_with(end - 1); ++i) {
+            visit(&sets[ptrdiff_t{at.row} * row_words + i], cells_between(at.word, end - 1, i));
+        }
     }
 
     bit_word* sets = nullptr;
@@ -138,10 +164,11 @@ public:
     void trace(cell start, Visit visit) {
         visit(start);
         cell at = start;
-        int direction = LEFT;
+        unsigned direction = LEFT;
         for (;;) {
             const unsigned ahead = looking_from(direction, neighbours(at));
-            const int background = ahead == 0 ? DIRECTIONS : lowest_bit(ahead);
+            const unsigned background =
+                ahead == 0 ? DIRECTIONS : static_cast<unsigned>(lowest_bit(ahead));
             mark_straight(at, direction, background);
             if (ahead == 0) return;
             direction = (direction + background) % DIRECTIONS;
@@ -161,14 +188,13 @@ public:
     }
     void set_unvisited(cell c) { visited(word_of(c)) &= ~bit_of(c); }
 
-    // Calls visit(word_place), row by row, for each word of the cells in `area` that the mask began
-    // with members in.
+    // Calls visit(word_place), row by row, for each word of the cells in `area` that is in `words`.
     template <class Visit>
-    void for_each_occupied(const ze_rect& area, Visit visit) const {
-        const int end = area.right / WORD_BITS + 1;
+    static void for_each_word(const word_set& words, const ze_rect& area, Visit visit) {
+        const int end = word_with(area.right) + 1;
         for (int row = area.top; row <= area.bottom; ++row) {
-            for (word_place at = {row, area.left / WORD_BITS};; ++at.word) {
-                at.word = occupied.next(at, end);
+            for (word_place at = {row, word_with(area.left)};; ++at.word) {
+                at.word = words.next(at, end);
                 if (at.word == end) break;
                 visit(at);
             }
@@ -179,7 +205,7 @@ public:
     // cell visited; it may make others so too, and more members of visited cells.
     template <class Visit>
     void for_each_unvisited(Visit visit) const {
-        for_each_occupied(all_cells(), [&](word_place at) {
+        for_each_word(unfinished, all_cells(), [&](word_place at) {
             while (const bit_word left = member(at) & ~visited(at)) {
                 visit(cell{at.word * WORD_BITS + lowest_bit(left), at.row});
             }
@@ -188,19 +214,32 @@ public:
 
     ze_rect all_cells() const { return {1, column_count, 1, row_count}; }
 
+    word_set occupied;    // words that the mask began with members in
+    word_set unfinished;  // those of them that can have members that are not visited
+
     // ---- words that changed
 
     // Notes a change of a visited cell, or of a marker beside a cell, in a word.
     void touch(word_place at) {
         dirty.insert(at);
-        dirty_rows[at.row / WORD_BITS] |= bit_word{1} << at.row % WORD_BITS;
+        dirty_rows[word_with(at.row)] |= bit_word{1} << place_in_word(at.row);
     }
 
     // The first dirty word of the cells in `area` at or behind `at`: in its row, or else in a later
     // one. Below the area when there is none.
     //
     // A row gone into for its dirty words is not looked at again before one is touched anew.
-    word_place next_dirty(word_place at, const ze_rect& area);
+    word_place next_dirty(word_place at, const ze_rect& area) {
+        const int first = word_with(area.left);
+        const int end = word_with(area.right) + 1;
+        for (;;) {
+            at.word = dirty.next(at, end);
+            if (at.word < end) return at;
+            at = {next_bit(dirty_rows, at.row + 1, area.bottom + 1), first};
+            if (at.row > area.bottom) return at;
+            dirty_rows[word_with(at.row)] &= ~(bit_word{1} << place_in_word(at.row));
+        }
+    }
 
     word_set dirty;   // touched; whoever has seen to a word erases it
     word_set marked;  // words in which a cell has a marker beside it; left by clear_markers() too
@@ -228,23 +267,23 @@ public:
     ze_rect contours;
 
 private:
-    static constexpr int DIRECTIONS = 8;
-    static constexpr int LEFT = 7;
+    static constexpr unsigned DIRECTIONS = 8;
+    static constexpr unsigned LEFT = 7;
+    static constexpr unsigned STRAIGHT = 0xAA;  // the set of the odd directions
     static constexpr int DX[DIRECTIONS] = {-1, 0, 1, 1, 1, 0, -1, -1};
     static constexpr int DY[DIRECTIONS] = {-1, -1, -1, 0, 1, 1, 1, 0};
 
     // A set of directions turned so that bit 0 is `direction` and bit 1 the one clockwise from it.
-    static unsigned looking_from(int direction, unsigned directions) {
+    static unsigned looking_from(unsigned direction, unsigned directions) {
         return (directions >> direction | directions << (DIRECTIONS - direction)) & 0xFF;
     }
 
     // Bits 0 to 2: the members left of `column`, in it and right of it.
     static unsigned three_bits(const bit_word* row, int column) {
-        const int first = column - 1;
-        const bit_word* const word = row + first / WORD_BITS;
-        const int shift = first % WORD_BITS;
-        bit_word bits = word[0] >> shift;
-        if (shift > WORD_BITS - 3) bits |= word[1] << (WORD_BITS - shift);
+        const bit_word* const word = row + word_with(column - 1);
+        const int first = place_in_word(column - 1);
+        bit_word bits = word[0] >> first;
+        if (first > WORD_BITS - 3) bits |= word[1] << (WORD_BITS - first);
         return bits & 7;
     }
 
@@ -259,10 +298,12 @@ private:
     }
 
     // Marks the straight neighbours of c among `count` ones clockwise from `direction`.
-    void mark_straight(cell c, int direction, int count) {
-        for (int i = 0; i < count; ++i) {
-            const int d = (direction + i) % DIRECTIONS;
-            if (d % 2 == 1) mark({c.column + DX[d], c.row + DY[d]});
+    void mark_straight(cell c, unsigned direction, unsigned count) {
+        const unsigned looked_at = ((1u << count) - 1) << direction;
+        for (unsigned left = (looked_at | looked_at >> DIRECTIONS) & STRAIGHT; left != 0;
+             left &= left - 1) {
+            const int d = lowest_bit(left);
+            mark({c.column + DX[d], c.row + DY[d]});
         }
     }
 
@@ -279,11 +320,15 @@ private:
         bit_word& word = markers[offset(word_of(c))];
         if ((word & bit_of(c)) != 0) return;
         word |= bit_of(c);
-        for (const int column : {std::max(c.column - 1, 0), c.column + 1}) {
-            const word_place beside = word_of({column, c.row});
-            marked.insert(beside);
-            touch(beside);
-        }
+        note_marker(word_of(c));
+        // The cell beside it may lie in the next word. There is none before the first.
+        const int place = place_in_word(c.column);
+        if (place == 0 && c.column != 0) note_marker(word_of({c.column - 1, c.row}));
+        if (place == WORD_BITS - 1) note_marker(word_of({c.column + 1, c.row}));
+    }
+    void note_marker(word_place beside) {
+        marked.insert(beside);
+        touch(beside);
     }
 
     ptrdiff_t offset(word_place at) const { return ptrdiff_t{at.row} * row_words + at.word; }
@@ -302,6 +347,5 @@ private:
     bit_word* members = nullptr;  // where the work buffer starts
     bit_word* visits = nullptr;
     bit_word* markers = nullptr;
-    word_set occupied;               // words that the mask began with members in
     bit_word* dirty_rows = nullptr;  // a set of rows
 };

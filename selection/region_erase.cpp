@@ -41,7 +41,7 @@ struct counting {
 void restore_interior(region_bits* bits) {
     const ze_rect area = bits->contours;
     bool inside = false;
-    bits->for_each_occupied(area, [&](word_place at) {
+    region_bits::for_each_word(bits->occupied, area, [&](word_place at) {
         const bit_word here = cells_between(area.left, area.right, at.word);
         const bit_word contour = bits->member(at) & ~bits->visited(at) & here;
         const bit_word right = bits->marked_right(at);
@@ -78,7 +78,7 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
         ++regions;
     });
     if (regions <= 1) {
-        bits.for_each_occupied(bits.all_cells(), [&](word_place at) {
+        region_bits::for_each_word(bits.occupied, bits.all_cells(), [&](word_place at) {
             bits.include_bits(boundary, at, bits.member(at));
         });
         return;
@@ -86,7 +86,7 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
     bits.clear_markers();
     bits.trace(best, [&bits](cell c) { bits.set_unvisited(c); });
     restore_interior(&bits);
-    bits.for_each_occupied(bits.all_cells(), [&](word_place at) {
+    region_bits::for_each_word(bits.occupied, bits.all_cells(), [&](word_place at) {
         const bit_word erased = bits.visited(at);
         bits.include_bits(rect, at, erased);
         bits.include_bits(boundary, at, bits.member(at) & ~erased);

@@ -4,7 +4,7 @@
 // (interior_pass.h).
 //
 // A pass takes one work buffer and frees it before it returns: three bits for each pixel of the
-// box, in words of 64, and four words for each row.
+// box, in words of 64, and five words for each row.
 #pragma once
 
 #include "selection/ze_rect.h"
