@@ -2,17 +2,19 @@
 //
 // After each region that it traces, a pass goes through all cells of the area that its traces have
 // covered so far, row by row, with a flag that says whether a cell is inside (region_plain.cpp has
-// the loops). What it finds follows from *events*, visited cells with a marker beside them: each
-// sets the flag or clears it, whatever was before; the cells from there to the next event are
-// inside or are not. So a pass that looks only at these cells comes to the same:
+// the loops). The flag follows from *events*, visited cells with a marker beside them: each sets it
+// or clears it, whatever it was before, and it holds to the next event. Inside cells are turned,
+// and stay so. Hence a pass changes nothing but
 //
-// - behind an event that is new since the pass before, up to the next event;
-// - in the part of the area that is new.
+// - behind an event that is new since the pass before, as far as the flag is other than it was
+// then;
+// - in cells that are new to the area.
 //
-// All else the pass before has seen in the same state, and left as this one would: a cell once
-// turned stays. Nothing that a pass turns is an event to the same pass, which looks at a cell
-// before it turns it; it is to the next. Words with new visited cells or markers are dirty
-// (region_bits.h).
+// So the pass here starts at words that changed, which are dirty (region_bits.h), goes on until the
+// flag behind a word is the one that it kept of the last time, and ends with the same cells turned.
+//
+// A cell that a pass turns is no event to the same pass, which looks at each cell before it turns
+// it; it is to the next. A word in which that matters is dirty again.
 #pragma once
 
 #include "selection/region_bits.h"
@@ -55,7 +57,8 @@ public:
     void run() {
         area = bits.contours;
         if (area.left > area.right) return;
-        touch_new_area();
+        if (covered.left <= covered.right && !(area == covered)) take_in_new_area();
+        covered = area;
         word_place at = bits.next_dirty({area.top - 1, last_word() + 1}, area);
         while (at.row <= area.bottom) at = bits.next_dirty(go_on_from(at), area);
     }
@@ -67,33 +70,27 @@ private:
     // The bits of a word's cells in the area.
     bit_word in_area(int word) const { return cells_between(area.left, area.right, word); }
 
-    // Makes the words dirty in which cells are new to the area, as far as they can matter: those
-    // with members, and those behind a flag that was set at the end of a row.
-    void touch_new_area() {
-        if (area == covered) return;
+    // Sees to the cells that are new to the area. Words of them that have changed are dirty, so it
+    // is enough to go on from where the flag was set at the area's edge, and to look again at words
+    // that were seen to while a part of them lay outside.
+    void take_in_new_area() {
         const bool wider = area.left < covered.left || area.right > covered.right;
-        for (int row = area.top; row <= area.bottom; ++row) {
-            if (row < covered.top || row > covered.bottom) {
-                touch_members(row, area.left, area.right);
-                continue;
+        for (int row = wider ? covered.top : covered.bottom; row <= covered.bottom; ++row) {
+            for (const int column : {covered.left, covered.right}) {
+                const word_place edge = word_of({column, row});
+                const bit_word seen = cells_between(covered.left, covered.right, edge.word);
+                if ((bits.visited(edge) & in_area(edge.word) & ~seen) != 0) bits.touch(edge);
             }
-            touch_members(row, area.left, covered.left - 1);
-            touch_members(row, covered.right + 1, area.right);
-            const word_place end = {row, word_with(covered.right)};
-            if ((wider || row == covered.bottom) && bits.flags.has(end)) {
-                bits.flags.erase(end);  // so that it is handed on again
-                bits.touch(end);
-            }
+            bits.look_again_at(row);
+            hand_on_flag(word_of({covered.right, row}));
         }
-        covered = area;
     }
 
-    void touch_members(int row, int first, int last) {
-        if (first > last) return;
-        for (int word = word_with(first); word <= word_with(last); ++word) {
-            const bit_word members = bits.member({row, word}) & cells_between(first, last, word);
-            if (members != 0) bits.touch({row, word});
-        }
+    // Has a flag that is set passed on to the cells behind.
+    void hand_on_flag(word_place at) {
+        if (!bits.flags.has(at)) return;
+        bits.flags.erase(at);
+        bits.touch(at);
     }
 
     bool flag_before(word_place at) const {

@@ -105,14 +105,12 @@ bit_word region_bits::read_word(unsigned char* pixels, int count, const region_v
     // Nearly all words hold only 0 or only 1, and nearly all others both; none of these has visited
     // pixels or some to replace.
     bit_word some = 0;
-    bit_word every = EIGHT_ONES;
-    for (int i = 0; i < WORD_BITS; i += 8) {
-        some |= load_bytes(from + i);
-        every &= load_bytes(from + i);
-    }
+    for (int i = 0; i < WORD_BITS; i += 8) some |= load_bytes(from + i);
     if (some == 0) return 0;
     if ((some & ~EIGHT_ONES) == 0) {
         if (!values.member.has(1)) return 0;
+        bit_word every = some;
+        for (int i = 0; i < WORD_BITS; i += 8) every &= load_bytes(from + i);
         if (every == EIGHT_ONES) return ~bit_word{0};
         bit_word ones = 0;
         for (int i = 0; i < WORD_BITS; i += 8) ones |= pack(load_bytes(from + i)) << i;
@@ -130,7 +128,9 @@ bit_word region_bits::read_word(unsigned char* pixels, int count, const region_v
 }
 
 void region_bits::clear_markers() {
-    ze_memset(markers, 0, static_cast<size_t>(markers - visits) * sizeof(bit_word));
+    // A marker's own word is always among the marked ones.
+    for_each_word(marked, {0, column_count + 1, 0, row_count + 1},
+                  [this](word_place at) { markers[offset(at)] = 0; });
 }
 
 void region_bits::mark_sharing(cell c) {
@@ -163,12 +163,4 @@ void region_bits::write(word_place at, bit_word bits, unsigned char value) const
     for_each_run(bits, [&](int first, int count) {
         ze_memset(pixel({at.word * WORD_BITS + first, at.row}), value, static_cast<size_t>(count));
     });
-}
-
-void region_bits::include_bits(ze_rect* r, word_place at, bit_word bits) const {
-    if (bits == 0) return;
-    const int x = box.left - 1 + at.word * WORD_BITS;
-    const int y = box.top - 1 + at.row;
-    include(r, x + lowest_bit(bits), y);
-    include(r, x + highest_bit(bits), y);
 }

@@ -28,6 +28,10 @@ constexpr int place_in_word(int bit) {
 
 constexpr int lowest_bit(bit_word bits) { return __builtin_ctzll(bits); }
 constexpr int highest_bit(bit_word bits) { return WORD_BITS - 1 - __builtin_clzll(bits); }
+constexpr int count_bits(bit_word bits) {
+    // Not every processor counts in one instruction, and most words are full.
+    return bits == ~bit_word{0} ? WORD_BITS : __builtin_popcountll(bits);
+}
 constexpr bit_word bits_from(int bit) { return ~bit_word{0} << bit; }
 constexpr bit_word bits_up_to(int bit) { return ~bit_word{0} >> (WORD_BITS - 1 - bit); }
 
@@ -222,13 +226,14 @@ public:
     // Notes a change of a visited cell, or of a marker beside a cell, in a word.
     void touch(word_place at) {
         dirty.insert(at);
-        dirty_rows[word_with(at.row)] |= bit_word{1} << place_in_word(at.row);
+        look_again_at(at.row);
     }
 
     // The first dirty word of the cells in `area` at or behind `at`: in its row, or else in a later
     // one. Below the area when there is none.
     //
-    // A row gone into for its dirty words is not looked at again before one is touched anew.
+    // A row gone into for its dirty words, of which some may lie outside the area, is not looked at
+    // again before one is touched anew or look_again_at() says so.
     word_place next_dirty(word_place at, const ze_rect& area) {
         const int first = word_with(area.left);
         const int end = word_with(area.right) + 1;
@@ -240,6 +245,8 @@ public:
             dirty_rows[word_with(at.row)] &= ~(bit_word{1} << place_in_word(at.row));
         }
     }
+
+    void look_again_at(int row) { dirty_rows[word_with(row)] |= bit_word{1} << place_in_word(row); }
 
     word_set dirty;   // touched; whoever has seen to a word erases it
     word_set marked;  // words in which a cell has a marker beside it; left by clear_markers() too
@@ -259,7 +266,12 @@ public:
     void write(word_place at, bit_word bits, unsigned char value) const;
 
     // Widens r, a rectangle of the image, over the cells of `bits`.
-    void include_bits(ze_rect* r, word_place at, bit_word bits) const;
+    void include_bits(ze_rect* r, word_place at, bit_word bits) const {
+        if (bits == 0) return;
+        const int x = box.left - 1 + at.word * WORD_BITS;
+        const int y = box.top - 1 + at.row;
+        unite(r, {x + lowest_bit(bits), x + highest_bit(bits), y, y});
+    }
 
     // Covers, in cells, every cell that a trace has moved to; left > right at first.
     //

@@ -26,9 +26,9 @@ struct counting {
 
     bit_word turn(region_bits* bits, word_place at, bit_word inside) {
         const bit_word turned = inside & bits->member(at) & ~bits->visited(at);
-        if (turned == 0) return 0;
+        if (turned == 0) return turned;
         bits->visited(at) |= turned;
-        count += __builtin_popcountll(turned);
+        count += count_bits(turned);
         return turned;
     }
 
@@ -43,12 +43,13 @@ void restore_interior(region_bits* bits) {
     bool inside = false;
     region_bits::for_each_word(bits->occupied, area, [&](word_place at) {
         const bit_word here = cells_between(area.left, area.right, at.word);
+        if (!bits->marked.has(at)) {
+            if (inside) bits->visited(at) &= ~here;
+            return;
+        }
         const bit_word contour = bits->member(at) & ~bits->visited(at) & here;
         const bit_word right = bits->marked_right(at);
-        const flag_events events =
-            bits->marked.has(at)
-                ? flag_events{contour & bits->marked_left(at) & ~right, contour & right}
-                : flag_events{0, 0};
+        const flag_events events = {contour & bits->marked_left(at) & ~right, contour & right};
         bits->visited(at) &= ~(events.inside(inside) & here);
         if (!events.none()) inside = events.last();
     });
@@ -66,7 +67,7 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
     interior_pass<counting> interiors(&bits, &counted);
     int64_t regions = 0;
     int64_t best_count = 0;
-    cell best = {0, 0};
+    cell best = {};
     bits.for_each_unvisited([&](cell start) {
         bits.trace(start, [&bits](cell c) { bits.set_visited(c); });
         counted.count = 0;
@@ -90,6 +91,6 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
         const bit_word erased = bits.visited(at);
         bits.include_bits(rect, at, erased);
         bits.include_bits(boundary, at, bits.member(at) & ~erased);
-        bits.write(at, erased, 0);
+        if (erased != 0) bits.write(at, erased, 0);
     });
 }

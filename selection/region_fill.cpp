@@ -31,7 +31,7 @@ struct filling {
 
     bit_word turn(region_bits* bits, word_place at, bit_word inside) const {
         const bit_word filled = inside & ~bits->visited(at);
-        if (filled == 0) return 0;
+        if (filled == 0) return filled;
         const bit_word joining = filled & ~bits->member(at);
         bits->visited(at) |= filled;
         if (joining == 0) return filled;
