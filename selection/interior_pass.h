@@ -68,22 +68,26 @@ private:
     int last_word() const { return word_with(area.right); }
 
     // The bits of a word's cells in the area.
-    bit_word in_area(int word) const { return cells_between(area.left, area.right, word); }
+    bit_word in_area(int word) const { return bits_between(area.left, area.right, word); }
 
     // Sees to the cells that are new to the area. Words of them that have changed are dirty, so it
     // is enough to go on from where the flag was set at the area's edge, and to look again at words
     // that were seen to while a part of them lay outside.
     void take_in_new_area() {
         const bool wider = area.left < covered.left || area.right > covered.right;
-        for (int row = wider ? covered.top : covered.bottom; row <= covered.bottom; ++row) {
-            for (const int column : {covered.left, covered.right}) {
-                const word_place edge = word_of({column, row});
-                const bit_word seen = cells_between(covered.left, covered.right, edge.word);
-                if ((bits.visited(edge) & in_area(edge.word) & ~seen) != 0) bits.touch(edge);
+        const int first_row = wider ? covered.top : covered.bottom;
+        for (const int column : {covered.left, covered.right}) {
+            const int word = word_with(column);
+            const bit_word seen = bits_between(covered.left, covered.right, word);
+            const bit_word new_cells = in_area(word) & ~seen;
+            for (int row = first_row; new_cells != 0 && row <= covered.bottom; ++row) {
+                if ((bits.visited({row, word}) & new_cells) != 0) bits.touch({row, word});
             }
-            bits.look_again_at(row);
+        }
+        for (int row = first_row; row <= covered.bottom; ++row) {
             hand_on_flag(word_of({covered.right, row}));
         }
+        bits.look_again_at(first_row, covered.bottom);
     }
 
     // Has a flag that is set passed on to the cells behind.

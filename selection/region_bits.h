@@ -35,8 +35,9 @@ constexpr int count_bits(bit_word bits) {
 constexpr bit_word bits_from(int bit) { return ~bit_word{0} << bit; }
 constexpr bit_word bits_up_to(int bit) { return ~bit_word{0} >> (WORD_BITS - 1 - bit); }
 
-// The bits of word number `word` for cells first .. last of a row. REQUIRES: it has some.
-constexpr bit_word cells_between(int first, int last, int word) {
+// Those of bits first .. last of a row of words that word number `word` holds. REQUIRES: it holds
+// some.
+constexpr bit_word bits_between(int first, int last, int word) {
     return (word == word_with(first) ? bits_from(place_in_word(first)) : ~bit_word{0}) &
            (word == word_with(last) ? bits_up_to(place_in_word(last)) : ~bit_word{0});
 }
@@ -61,6 +62,15 @@ inline int next_bit(const bit_word* bits, int from, int end) {
         if (ahead != 0) return std::min(bit + lowest_bit(ahead), end);
     }
     return end;
+}
+
+// The last one at or before `from` in a row of words, or -1.
+inline int previous_bit(const bit_word* bits, int from) {
+    for (int bit = from; bit >= 0; bit -= place_in_word(bit) + 1) {
+        const bit_word before = bits[word_with(bit)] & bits_up_to(place_in_word(bit));
+        if (before != 0) return bit - place_in_word(bit) + highest_bit(before);
+    }
+    return -1;
 }
 
 struct cell {
@@ -103,6 +113,11 @@ public:
         return next_bit(sets + ptrdiff_t{at.row} * row_words, at.word, end);
     }
 
+    // The last word of the set at or before `at` in its row, or -1.
+    int previous(word_place at) const {
+        return previous_bit(sets + ptrdiff_t{at.row} * row_words, at.word);
+    }
+
 private:
     static bit_word bit_of(word_place at) { return bit_word{1} << place_in_word(at.word); }
     bit_word& set_of(word_place at) const {
@@ -113,7 +128,7 @@ private:
     void for_each_set(word_place at, int end, Visit visit) {
         if (at.word >= end) return;
         for (int i = word_with(at.word); i <= word_with(end - 1); ++i) {
-            visit(&sets[ptrdiff_t{at.row} * row_words + i], cells_between(at.word, end - 1, i));
+            visit(&sets[ptrdiff_t{at.row} * row_words + i], bits_between(at.word, end - 1, i));
         }
     }
 
@@ -226,7 +241,7 @@ public:
     // Notes a change of a visited cell, or of a marker beside a cell, in a word.
     void touch(word_place at) {
         dirty.insert(at);
-        look_again_at(at.row);
+        look_again_at(at.row, at.row);
     }
 
     // The first dirty word of the cells in `area` at or behind `at`: in its row, or else in a later
@@ -246,7 +261,11 @@ public:
         }
     }
 
-    void look_again_at(int row) { dirty_rows[word_with(row)] |= bit_word{1} << place_in_word(row); }
+    void look_again_at(int first_row, int last_row) {
+        for (int i = word_with(first_row); i <= word_with(last_row); ++i) {
+            dirty_rows[i] |= bits_between(first_row, last_row, i);
+        }
+    }
 
     word_set dirty;   // touched; whoever has seen to a word erases it
     word_set marked;  // words in which a cell has a marker beside it; left by clear_markers() too
@@ -271,6 +290,22 @@ public:
         const int x = box.left - 1 + at.word * WORD_BITS;
         const int y = box.top - 1 + at.row;
         unite(r, {x + lowest_bit(bits), x + highest_bit(bits), y, y});
+    }
+
+    // Widens r over the cells of all bits_of(word_place), of which only occupied words have some.
+    template <class BitsOf>
+    void include_all(ze_rect* r, BitsOf bits_of) const {
+        for (int row = 1; row <= row_count; ++row) {
+            word_place at = {row, occupied.next({row, 0}, row_words)};
+            while (at.word < row_words && bits_of(at) == 0) {
+                at.word = occupied.next({row, at.word + 1}, row_words);
+            }
+            if (at.word == row_words) continue;
+            include_bits(r, at, bits_of(at));
+            at.word = occupied.previous({row, row_words - 1});
+            while (bits_of(at) == 0) at.word = occupied.previous({row, at.word - 1});
+            include_bits(r, at, bits_of(at));
+        }
     }
 
     // Covers, in cells, every cell that a trace has moved to; left > right at first.

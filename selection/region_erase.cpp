@@ -42,7 +42,7 @@ void restore_interior(region_bits* bits) {
     const ze_rect area = bits->contours;
     bool inside = false;
     region_bits::for_each_word(bits->occupied, area, [&](word_place at) {
-        const bit_word here = cells_between(area.left, area.right, at.word);
+        const bit_word here = bits_between(area.left, area.right, at.word);
         if (!bits->marked.has(at)) {
             if (inside) bits->visited(at) &= ~here;
             return;
@@ -79,9 +79,7 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
         ++regions;
     });
     if (regions <= 1) {
-        region_bits::for_each_word(bits.occupied, bits.all_cells(), [&](word_place at) {
-            bits.include_bits(boundary, at, bits.member(at));
-        });
+        bits.include_all(boundary, [&bits](word_place at) { return bits.member(at); });
         return;
     }
     bits.clear_markers();
@@ -89,8 +87,10 @@ void Erase_Region(unsigned char* mask, int width, int height, ze_rect* boundary,
     restore_interior(&bits);
     region_bits::for_each_word(bits.occupied, bits.all_cells(), [&](word_place at) {
         const bit_word erased = bits.visited(at);
+        if (erased == 0) return;
         bits.include_bits(rect, at, erased);
-        bits.include_bits(boundary, at, bits.member(at) & ~erased);
-        if (erased != 0) bits.write(at, erased, 0);
+        bits.write(at, erased, 0);
     });
+    bits.include_all(boundary,
+                     [&bits](word_place at) { return bits.member(at) & ~bits.visited(at); });
 }

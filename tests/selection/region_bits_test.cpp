@@ -51,10 +51,10 @@ TEST(bits, RunsAreFoundFromTheLowestOn) {
 }
 
 TEST(bits, CellsBetweenTwoColumnsAreCutAtTheirWords) {
-    EXPECT_EQ(cells_between(3, 5, 0), 0x38u);
-    EXPECT_EQ(cells_between(60, 130, 0), bit_word{0xF} << 60);
-    EXPECT_EQ(cells_between(60, 130, 1), ~bit_word{0});
-    EXPECT_EQ(cells_between(60, 130, 2), 0x7u);
+    EXPECT_EQ(bits_between(3, 5, 0), 0x38u);
+    EXPECT_EQ(bits_between(60, 130, 0), bit_word{0xF} << 60);
+    EXPECT_EQ(bits_between(60, 130, 1), ~bit_word{0});
+    EXPECT_EQ(bits_between(60, 130, 2), 0x7u);
 }
 
 TEST(bits, TheNextOneIsLookedForUpToTheEnd) {
@@ -65,6 +65,15 @@ TEST(bits, TheNextOneIsLookedForUpToTheEnd) {
     EXPECT_EQ(next_bit(row, 5, 129), 129) << "the end comes first";
     EXPECT_EQ(next_bit(row, 5, 100), 100);
     EXPECT_EQ(next_bit(row, 7, 7), 7);
+}
+
+TEST(bits, ThePreviousOneIsLookedForDownToTheStart) {
+    const bit_word row[3] = {0x10, 0, 0x2};
+    EXPECT_EQ(previous_bit(row, 191), 129);
+    EXPECT_EQ(previous_bit(row, 129), 129);
+    EXPECT_EQ(previous_bit(row, 128), 4);
+    EXPECT_EQ(previous_bit(row, 4), 4);
+    EXPECT_EQ(previous_bit(row, 3), -1);
 }
 
 // ---- reading the mask
