@@ -36,12 +36,13 @@ struct view_axis {
     int32_t at(int position) const { return wrap_add(origin, wrap_mul(position, step)); }
 };
 
-constexpr int32_t HALF_PIXEL = 0x8000;  // 0.5 in 16.16
+constexpr int32_t ONE_PIXEL = 0x10000;  // 1 in 16.16
+constexpr int32_t HALF_PIXEL = 0x8000;
 
 // The axis for `offset`, the photo column or row that view position 0 shows, and a scale in photo
 // pixels per view pixel. The scale loses what lies below 1/65536; beyond 16.16 it saturates.
 inline view_axis axis_of(float scale, int offset, int32_t rounding = 0) {
-    return {wrap_add(wrap_mul(offset, 0x10000), rounding), saturating_truncate(scale * 65536.0f)};
+    return {wrap_add(wrap_mul(offset, ONE_PIXEL), rounding), saturating_truncate(scale * 65536.0f)};
 }
 
 // Whole photo pixels of a 16.16 position, rounded towards minus infinity.

@@ -1,31 +1,50 @@
 #include "jni/view_image.h"
 
+#include <algorithm>
+
+#include "jni/photo_columns.h"
+#include "jni/view_plain.h"
+
+// view_plain.cpp says pixel by pixel what these draw. A view row depends on nothing but its photo
+// row: a row that shows the same photo row as the one above is a copy of that. What photo column a
+// view column shows is the same for every row.
+
 void draw_image(const view_pixels& view, const photo_pixels& photo, float scale, int offset_x,
                 int offset_y, const ze_rect& area) {
-    if (area.left > area.right) return;
     const view_axis columns = axis_of(scale, offset_x);
     const view_axis rows = axis_of(scale, offset_y);
-    int32_t row_position = rows.at(area.top);
-    for (int64_t y = area.top; y <= area.bottom; ++y) {
-        const int32_t* const from = photo.row(clamp_to_photo(whole(row_position), photo.height));
-        int32_t* const to = view.row(y);
-        int32_t position = columns.at(area.left);
-        for (int64_t x = area.left; x <= area.right; ++x) {
-            to[x] = from[clamp_to_photo(whole(position), photo.width)];
-            position = wrap_add(position, columns.step);
+    if (!has_rows_of_its_own(view, photo, area) ||
+        !rises(columns.at(area.left), columns.step, int64_t{area.right} - area.left)) {
+        plain::draw_image(view, photo, scale, offset_x, offset_y, area);
+        return;
+    }
+    for (int64_t left = area.left; left <= area.right; left += TILE) {
+        const int n = static_cast<int>(std::min<int64_t>(TILE, area.right - left + 1));
+        const photo_columns shown(columns.at(static_cast<int>(left)), columns.step, n, photo.width);
+        const int32_t* above = nullptr;
+        for (int64_t y = area.top; y <= area.bottom; ++y) {
+            const int photo_y = clamp_to_photo(whole(rows.at(static_cast<int>(y))), photo.height);
+            const int32_t* const from = photo.row(photo_y);
+            int32_t* const to = view.row(y) + left;
+            if (from == above) {
+                std::copy_n(to - view.width, n, to);
+            } else {
+                shown.show(from, to);
+            }
+            above = from;
         }
-        row_position = wrap_add(row_position, rows.step);
     }
 }
 
 void draw_small_image(const view_pixels& view, const photo_pixels& photo, const ze_rect& area) {
-    if (area.left > area.right) return;
+    if (!has_rows_of_its_own(view, photo, area)) {
+        plain::draw_small_image(view, photo, area);
+        return;
+    }
+    const int64_t columns = int64_t{area.right} - area.left + 1;
     for (int64_t y = area.top; y <= area.bottom; ++y) {
-        const int32_t* const from = photo.row(clamp_to_photo(y - area.top, photo.height));
-        int32_t* const to = view.row(y);
-        for (int64_t x = area.left; x <= area.right; ++x) {
-            to[x] = from[clamp_to_photo(x - area.left, photo.width)];
-        }
+        const int photo_y = clamp_to_photo(y - area.top, photo.height);
+        show_unscaled(photo.row(photo_y), photo.width, view.row(y) + area.left, columns);
     }
 }
 

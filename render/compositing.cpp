@@ -1,34 +1,28 @@
 #include "render/compositing.h"
 
+#include <algorithm>
 #include <cstddef>
 
+#include "render/row_kernels.h"
 #include "support/arithmetic.h"
 
-namespace {
-
-uint32_t grey(uint32_t pixel) {
-    const uint32_t sum = (pixel >> 16 & 0xFF) + (pixel >> 8 & 0xFF) + (pixel & 0xFF);
-    return (pixel & 0xFF000000u) | sum / 3 * 0x010101u;
-}
-
-uint32_t colour_if(bool in_colour, uint32_t pixel) { return in_colour ? pixel : grey(pixel); }
-
-unsigned char inverted(unsigned char value) { return value != 1; }
-
-}  // namespace
+// compositing_plain.cpp says pixel by pixel what these draw. Pixels depend on nothing but the
+// source and the mask in their own places, so whole rows of them, and rows that follow one another
+// without a gap, are left to row kernels.
 
 void ze_argb2gray(uint32_t* src, int width, int height, uint32_t* dst) {
     const int64_t pixels = int64_t{width} * height;
-    for (int64_t i = 0; i < pixels; ++i) dst[i] = grey(src[i]);
+    if (pixels < 1) return;
+    row_kernels_of_this_cpu().grey(src, dst, static_cast<ptrdiff_t>(pixels));
 }
 
 void ze_draw_withmask(uint32_t* src, uint32_t* dst, unsigned char* mask, int width, int left,
                       int right, int top, int bottom) {
+    if (left > right) return;
+    const row_kernels& kernels = row_kernels_of_this_cpu();
     for (int64_t y = top; y <= bottom; ++y) {
-        for (int64_t x = left; x <= right; ++x) {
-            const int64_t i = y * width + x;
-            dst[i] = colour_if(mask[i] == 1, src[i]);
-        }
+        const int64_t i = y * width + left;
+        kernels.colour_selection(src + i, mask + i, dst + i, ptrdiff_t{right} - left + 1);
     }
 }
 
@@ -40,27 +34,48 @@ void ze_draw_withmask_v2(uint32_t* src, uint32_t* dst, unsigned char* mask, int 
 void ze_draw_reverse_mask(uint32_t* src, uint32_t* dst, unsigned char* mask, int width,
                           int height) {
     if (width < 1 || height < 1) return;
-    const int64_t pixels = int64_t{width} * height;
-    for (int64_t i = 0; i < pixels; ++i) {
-        mask[i] = inverted(mask[i]);
-        dst[i] = colour_if(mask[i] == 1, src[i]);
+    row_kernels_of_this_cpu().invert_and_colour(src, mask, dst, ptrdiff_t{width} * height);
+}
+
+namespace {
+
+constexpr int TILE = 2048;  // columns of an image whose lookups are worked out together
+
+// Writes what columns look up in a row of a mask of that many entries; the row starts at an entry.
+void look_up(const unsigned char* mask, int64_t entries, int64_t row, const int32_t* columns, int n,
+             unsigned char* found) {
+    for (int x = 0; x < n; ++x) {
+        const int64_t entry = row + columns[x];
+        found[x] = entry >= 0 && entry < entries ? mask[entry] : 0;
     }
 }
 
+}  // namespace
+
+// What mask column an image column looks up is the same for every row, and an image larger than its
+// mask has several rows that look up the same.
 void ze_draw_reverse_mask_v2(uint32_t* src, uint32_t* dst, unsigned char* mask, int, int width,
                              int height, int mask_width, int mask_height, float ratio) {
+    const row_kernels& kernels = row_kernels_of_this_cpu();
     const int64_t entries =
         mask_width > 0 && mask_height > 0 ? int64_t{mask_width} * mask_height : 0;
-    for (int64_t i = 0; i < entries; ++i) mask[i] = inverted(mask[i]);
+    kernels.invert(mask, static_cast<ptrdiff_t>(entries));
 
-    for (int y = 0; y < height; ++y) {
-        const int64_t mask_row =
-            int64_t{saturating_truncate(static_cast<float>(y) * ratio)} * mask_width;
-        for (int x = 0; x < width; ++x) {
-            const int64_t entry = mask_row + saturating_truncate(static_cast<float>(x) * ratio);
-            const bool selected = entry >= 0 && entry < entries && mask[entry] == 1;
-            const int64_t i = int64_t{y} * width + x;
-            dst[i] = colour_if(selected, src[i]);
+    for (int64_t left = 0; left < width; left += TILE) {
+        const int n = static_cast<int>(std::min<int64_t>(TILE, width - left));
+        int32_t columns[TILE];
+        for (int x = 0; x < n; ++x) {
+            columns[x] = saturating_truncate(static_cast<float>(left + x) * ratio);
+        }
+        unsigned char found[TILE];
+        int64_t row_found = INT64_MIN;  // of no mask
+        for (int y = 0; y < height; ++y) {
+            const int64_t row =
+                int64_t{saturating_truncate(static_cast<float>(y) * ratio)} * mask_width;
+            if (row != row_found) look_up(mask, entries, row, columns, n, found);
+            row_found = row;
+            const int64_t i = int64_t{y} * width + left;
+            kernels.colour_selection(src + i, found, dst + i, n);
         }
     }
 }

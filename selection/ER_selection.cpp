@@ -5,15 +5,17 @@
 #include <cstdint>
 #include <new>
 
+#include "selection/colour_cost.h"
+#include "selection/competition_memory.h"
 #include "support/ze_alloc.h"
 
 namespace {
 
 // `count` elements from array-new, or null when they cannot be had or their bytes not be counted.
 template <class T>
-T* new_array(size_t count) {
+T* new_array(uint64_t count) {
     if (count > PTRDIFF_MAX / sizeof(T)) return nullptr;
-    return new (std::nothrow) T[count];
+    return new (std::nothrow) T[static_cast<size_t>(count)];
 }
 
 brush_class classify(int64_t dx, int64_t dy, int radius, int core_radius) {
@@ -38,10 +40,11 @@ void build_brush(ER_selection* engine, int radius, int core_radius) {
     const size_t cells = static_cast<size_t>(side * side);
     if (!(engine->brush_map = new_array<unsigned char>(cells))) return;
     if (!(engine->node_map = new_array<node*>(cells))) return;
-    if (!(engine->cost_h = new_array<int>(cells))) return;
-    if (!(engine->cost_v = new_array<int>(cells))) return;
-    ze_memset(engine->cost_h, 0, cells * sizeof(int));
-    ze_memset(engine->cost_v, 0, cells * sizeof(int));
+    const size_t costs = cells + static_cast<size_t>(side);
+    if (!(engine->cost_h = new_array<int>(costs))) return;
+    if (!(engine->cost_v = new_array<int>(costs))) return;
+    ze_memset(engine->cost_h, 0, costs * sizeof(int));
+    ze_memset(engine->cost_v, 0, costs * sizeof(int));
     ze_memset(engine->node_map, 0, cells * sizeof(node*));
 
     unsigned char* cell = engine->brush_map;
@@ -53,7 +56,11 @@ void build_brush(ER_selection* engine, int radius, int core_radius) {
         }
     }
     engine->queue->step = std::max(engine->brush_cells / 100, 1);
-    engine->node_pool = new_array<node>(static_cast<size_t>(engine->brush_cells) + 1);
+    engine->node_pool = new_array<node>(nodes_of_pool(side, engine->brush_cells));
+    if (!engine->node_pool) return;
+    cost_slots* const slots = slots_of_pool(engine->node_pool, side, engine->brush_cells);
+    ze_memset(slots->used, 0, sizeof slots->used);
+    ze_memset(slots->used_words, 0, sizeof slots->used_words);
 }
 
 }  // namespace
@@ -101,15 +108,7 @@ int ER_selection::cal_cost(int* image, int width, int x1, int y1, int x2, int y2
     const auto pixel = [image, width](int x, int y) {
         return static_cast<uint32_t>(image[x + static_cast<ptrdiff_t>(y) * width]);
     };
-    const uint32_t a = pixel(x1, y1);
-    const uint32_t b = pixel(x2, y2);
-    int cost = 0;
-    for (const int shift : {16, 8, 0}) {
-        const int difference =
-            static_cast<int>(a >> shift & 0xFF) - static_cast<int>(b >> shift & 0xFF);
-        cost += difference * difference;
-    }
-    return cost;
+    return colour_cost(pixel(x1, y1), pixel(x2, y2));
 }
 
 bool has_buffers(const ER_selection& engine) {

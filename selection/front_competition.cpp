@@ -3,289 +3,277 @@
 // The stroke's own front starts on the brush core, the keep front on the rim. Each advances through
 // inner cells along the cheapest path, a step costing the squared colour distance of its two pixels
 // (cal_cost), so they meet where the colour changes sharply. The nearest pixel overall is finalised
-// next; on a tie the front that came first keeps it. During a stroke the mask holds, for pixels
-// already won, the values below; a pixel that holds one of them is never reached again.
+// next; on a tie the front that came first keeps it.
 //
-// What sets shrinking apart from growing stands in the two rule types and nowhere else.
+// competition_plain.cpp says what comes out, with D_Queue. Here the cells have numbers and one
+// record each, the queue is front_queue, and the mask is left alone until all is decided. So a
+// stroke can be begun again: when the queue is in doubt what D_Queue would do, a queue that knows
+// more of D_Queue's index tries, and in the end the plain competition itself.
+#include "selection/front_competition.h"
 
 #include <algorithm>
 #include <cstdint>
 
-#include "selection/ER_selection.h"
+#include "selection/colour_cost.h"
+#include "selection/competition_memory.h"
+#include "selection/competition_plain.h"
+#include "selection/competition_rules.h"
+#include "selection/front_queue.h"
 #include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 
 namespace {
 
-constexpr unsigned char WON_BY_STROKE = 2;
-constexpr unsigned char KEPT_LIKE_SEEDS = 3;  // won by the keep front, held the value of its seeds
-constexpr unsigned char KEPT_OTHER = 4;       // won by the keep front, held another value
+// A popped cost from which no step can lead to UNREACHED or wrap.
+constexpr int HIGHEST_COST = UNREACHED - 1 - MAX_COLOUR_COST;
 
-// Growing: pixels won by the stroke become selected.
-struct growing {
-    // The keep front starts on unselected rim pixels.
-    static constexpr unsigned char SEED_VALUE = 0;
-
-    // Rows and columns at the far side of the square that are neither priced nor seeded.
-    static constexpr int UNSEEDED_EDGE = 0;
-
-    // Only growing clears the queue's spare field.
-    static constexpr bool CLEARS_SPARE = true;
-
-    // The point may not lie on the image's outermost rows and columns.
-    static bool may_start(const unsigned char*, int width, int height, int x, int y) {
-        return x >= 1 && x < width - int64_t{1} && y >= 1 && y < height - int64_t{1};
-    }
-
-    // Values that a front may still win. Deliberate: any other value blocks both fronts.
-    static bool is_open(unsigned char value) { return value <= 1; }
-
-    // Turns what the competition left in a pixel into its final value; true when rect takes it in.
-    //
-    // Deliberate: foreign values in the square become 0, and rect covers pixels that were selected
-    // all along.
-    static bool settle(unsigned char* pixel) {
-        *pixel = *pixel == 1 || *pixel == WON_BY_STROKE || *pixel == KEPT_OTHER;
-        return *pixel == 1;
-    }
-};
-
-// Shrinking: pixels won by the stroke become unselected.
-struct shrinking {
-    // The keep front starts on selected rim pixels.
-    static constexpr unsigned char SEED_VALUE = 1;
-
-    // Deliberate: so keep seeds are missing at the right and at the bottom of the brush.
-    static constexpr int UNSEEDED_EDGE = 1;
-
-    static constexpr bool CLEARS_SPARE = false;
-
-    // The point must be selected.
-    static bool may_start(const unsigned char* mask, int width, int height, int x, int y) {
-        return x >= 0 && x < width && y >= 0 && y < height && mask[x + ptrdiff_t{y} * width] == 1;
-    }
-
-    // Deliberate: foreign values are won like any other and then count as not selected.
-    static bool is_open(unsigned char value) { return value < WON_BY_STROKE || value > KEPT_OTHER; }
-
-    // Deliberate: values above 4 that no front reached stay. 2, 3 and 4 are taken for marks
-    // wherever they come from, so a lasso value 3 left in the square comes out selected. rect
-    // covers pixels that the keep front reached and that were unselected all along.
-    static bool settle(unsigned char* pixel) {
-        if (*pixel == KEPT_LIKE_SEEDS) *pixel = 1;
-        if (*pixel != WON_BY_STROKE && *pixel != KEPT_OTHER) return false;
-        *pixel = 0;
-        return true;
-    }
-};
-
-// The four neighbours, in the order in which the fronts visit them.
-enum direction { LEFT, RIGHT, UP, DOWN, DIRECTIONS };
-constexpr int DX[DIRECTIONS] = {-1, 1, 0, 0};
-constexpr int DY[DIRECTIONS] = {0, 0, -1, 1};
-
-// One stroke: the engine with the photo, the mask and the point it works on.
-template <class Rules>
-class competition {
-public:
-    competition(ER_selection* e, int* photo, unsigned char* selection, int w, int h, int px, int py)
-        : engine(*e),
-          queue(*e->queue),
-          image(photo),
-          mask(selection),
-          width(w),
-          height(h),
-          x(px),
-          y(py),
-          side(brush_side(*e)) {}
-
-    void reset() {
-        queue.count = 0;
-        ze_memset(queue.index, 0, QUEUE_INDEX_ENTRIES * sizeof(node*));
-        if (Rules::CLEARS_SPARE) queue.spare = 0;
-        engine.nodes_used = 0;
-    }
-
-    // Prices the pixels under the brush and queues the seeds of both fronts. False when the list is
-    // broken.
-    bool price_and_seed() {
-        const ze_rect seeded = square_in_image(Rules::UNSEEDED_EDGE);
-        for (int py = seeded.top; py <= seeded.bottom; ++py) {
-            for (int px = seeded.left; px <= seeded.right; ++px) {
-                const ptrdiff_t cell = cell_at(px, py);
-                const unsigned char cls = engine.brush_map[cell];
-                if (px > 0 && py > 0 && cls != BRUSH_OUTSIDE) {
-                    engine.cost_h[cell] = engine.cal_cost(image, width, px, py, px - 1, py);
-                    engine.cost_v[cell] = engine.cal_cost(image, width, px, py, px, py - 1);
-                }
-                const bool own = cls == BRUSH_CORE;
-                const bool keep = cls == BRUSH_RIM && mask_at(px, py) == Rules::SEED_VALUE;
-                if ((own || keep) && !add_node(cell, px, py, 0, own)) return false;
-            }
-        }
-        return true;
-    }
-
-    // Finalises the cheapest pixel, offers its neighbours to its front, and so on until the queue
-    // is empty or found broken.
-    void grow() {
-        while (!queue.empty()) {
-            // A copy: with a list left over from an earlier stroke, the record may be handed out
-            // anew for a neighbour.
-            const node n = *queue.pop();
-            if (!in_image(n.x, n.y) || !Rules::is_open(mask_at(n.x, n.y))) continue;
-            unsigned char& pixel = mask_at(n.x, n.y);
-            if (n.label == 1) {
-                pixel = WON_BY_STROKE;
-            } else {
-                pixel = pixel == Rules::SEED_VALUE ? KEPT_LIKE_SEEDS : KEPT_OTHER;
-            }
-            for (int d = LEFT; d < DIRECTIONS; ++d) {
-                if (!offer(n, static_cast<direction>(d))) return;
-            }
-        }
-    }
-
-    // Turns the marks of the competition into plain mask values, over the whole square.
-    void settle(ze_rect* rect) {
-        const ze_rect all = square_in_image(0);
-        for (int py = all.top; py <= all.bottom; ++py) {
-            for (int px = all.left; px <= all.right; ++px) {
-                if (Rules::settle(&mask_at(px, py))) include(rect, px, py);
-            }
-        }
-        ze_memset(engine.node_map, 0, static_cast<size_t>(side * side) * sizeof(node*));
-    }
-
-private:
-    // The brush square without its last `omitted` rows and columns, clipped to the image; empty
-    // for a negative radius.
-    ze_rect square_in_image(int omitted) const {
-        const int64_t r = engine.radius;
-        const auto first = [r](int centre, int size) {
-            return static_cast<int>(std::clamp<int64_t>(centre - r, 0, size));
-        };
-        const auto last = [r, omitted](int centre, int size) {
-            return static_cast<int>(std::clamp<int64_t>(centre + r - omitted, -1, size - 1));
-        };
-        return {first(x, width), last(x, width), first(y, height), last(y, height)};
-    }
+// A stroke: the engine with the photo, the mask and the point it works on.
+struct stroke_place {
+    ER_selection& engine;
+    int* image;
+    unsigned char* mask;
+    int width;
+    int height;
+    int x;
+    int y;
 
     ptrdiff_t cell_at(int px, int py) const {
         return brush_cell(engine, ptrdiff_t{px} - x, ptrdiff_t{py} - y);
     }
-
-    bool in_image(int px, int py) const { return px >= 0 && px < width && py >= 0 && py < height; }
-
-    bool in_square(int px, int py) const {
-        const int r = engine.radius;
-        return px - x <= r && x - px <= r && py - y <= r && y - py <= r;
+    ptrdiff_t pixel_at(int px, int py) const { return px + ptrdiff_t{py} * width; }
+    ze_rect square(int omitted) const {
+        return square_in_image(engine, width, height, x, y, omitted);
     }
-
-    unsigned char& mask_at(int px, int py) const { return mask[px + ptrdiff_t{py} * width]; }
-
-    // Takes the next record for the pixel of `cell` and queues it. False when the list is broken;
-    // the record is then not recorded in node_map.
-    bool add_node(ptrdiff_t cell, int px, int py, int cost, int label) {
-        node* const n = &engine.node_pool[engine.nodes_used];
-        *n = {px, py, cost, label, nullptr, nullptr};
-        if (!queue.push(n)) return false;
-        engine.node_map[cell] = n;
-        ++engine.nodes_used;
-        return true;
-    }
-
-    // Offers the neighbour of the finalised pixel `from` to that pixel's front. False when the list
-    // is broken.
-    bool offer(const node& from, direction d) {
-        const int nx = from.x + DX[d];
-        const int ny = from.y + DY[d];
-        if (!in_image(nx, ny) || !in_square(nx, ny)) return true;
-        const ptrdiff_t cell = cell_at(nx, ny);
-        if (engine.brush_map[cell] != BRUSH_INNER || !Rules::is_open(mask_at(nx, ny))) return true;
-
-        const int cost = wrap_add(from.cost, step_cost(cell, d));
-        node* const n = engine.node_map[cell];
-        if (!n) return add_node(cell, nx, ny, cost, from.label);
-        if (cost >= n->cost) return true;
-        n->cost = cost;
-        n->label = from.label;
-        return requeue(n);
-    }
-
-    // Colour cost of the step in direction d that ends on `cell`. cost_h and cost_v belong to the
-    // right and lower pixel of a pair.
-    int step_cost(ptrdiff_t cell, direction d) const {
-        switch (d) {
-            case LEFT:
-                return engine.cost_h[cell + 1];
-            case RIGHT:
-                return engine.cost_h[cell];
-            case UP:
-                return engine.cost_v[cell + side];
-            default:
-                return engine.cost_v[cell];
-        }
-    }
-
-    // Moves n to where its lowered cost belongs. False when the list is broken.
-    //
-    // Deliberate: the queue's index is not told that n leaves its place, and a new head keeps its
-    // `prev`.
-    bool requeue(node* n) {
-        if (queue.count == 1) return true;
-        if (n == queue.tail) {
-            queue.tail = n->prev;
-            if (queue.tail) queue.tail->next = nullptr;
-        } else if (n == queue.head) {
-            queue.head = n->next;
-        } else {
-            if (n->next) n->next->prev = n->prev;
-            if (n->prev) n->prev->next = n->next;
-        }
-        --queue.count;
-        return queue.push(n) != 0;
-    }
-
-    ER_selection& engine;
-    D_Queue& queue;
-    int* const image;
-    unsigned char* const mask;
-    const int width;
-    const int height;
-    const int x;
-    const int y;
-    const ptrdiff_t side;
 };
 
-// Runs one stroke at (x, y); see ER_selection for the arguments. Does nothing on an engine without
-// all its buffers.
-//
-// Deliberate, for both kinds of strokes:
-// - Cells in image row 0 and column 0 are not priced: they keep the costs that the same cell had in
-//   an earlier stroke, 0 after a brush rebuild, and steps along the image's edge use those.
-// - The queue's head and tail are not reset: what a broken list left there meets the next stroke.
-// - A broken list found while seeding abandons the stroke: the mask as it was, node_map with what
-//   was seeded. Found while growing, it ends the growth and the partial result stands.
+// Prices `count` cells from their pixels, `above` being the row before.
+void price_row(const int* pixels, const int* above, int* cost_h, int* cost_v, int count) {
+    for (int i = 0; i < count; ++i) {
+        const auto pixel = static_cast<uint32_t>(pixels[i]);
+        cost_h[i] = colour_cost(pixel, static_cast<uint32_t>(pixels[i - 1]));
+        cost_v[i] = colour_cost(pixel, static_cast<uint32_t>(above[i]));
+    }
+}
+
+// Deliberate: image row 0 and column 0 are left out; their cells keep the costs of an earlier
+// stroke, as do those outside the brush.
+void price(const stroke_place& s, const ze_rect& priced) {
+    for (int py = std::max(priced.top, 1); py <= priced.bottom; ++py) {
+        // The brush's cells in a row lie side by side.
+        int left = std::max(priced.left, 1);
+        int right = priced.right;
+        const unsigned char* const classes = s.engine.brush_map + s.cell_at(0, py);
+        while (left <= right && classes[left] == BRUSH_OUTSIDE) ++left;
+        while (left <= right && classes[right] == BRUSH_OUTSIDE) --right;
+        const ptrdiff_t cell = s.cell_at(left, py);
+        const int* const pixels = s.image + s.pixel_at(left, py);
+        price_row(pixels, pixels - s.width, s.engine.cost_h + cell, s.engine.cost_v + cell,
+                  right - left + 1);
+    }
+}
+
+bool can_be_a_cost(int cost) { return cost >= 0 && cost <= MAX_COLOUR_COST; }
+
+// The costs that price() leaves as they are, and by which fronts may step, are such as it could
+// have written. Anybody may write others into the engine.
+bool old_costs_are_sound(const stroke_place& s, const ze_rect& square) {
+    bool sound = true;
+    if (square.top == 0) {
+        for (int px = square.left; px <= square.right; ++px) {
+            sound &= can_be_a_cost(s.engine.cost_h[s.cell_at(px, 0)]);
+        }
+    }
+    if (square.left == 0) {
+        for (int py = square.top; py <= square.bottom; ++py) {
+            sound &= can_be_a_cost(s.engine.cost_v[s.cell_at(0, py)]);
+        }
+    }
+    return sound;
+}
+
+bool node_map_is_empty(const ER_selection& engine, ptrdiff_t cells) {
+    uintptr_t any = 0;
+    for (ptrdiff_t i = 0; i < cells; ++i) any |= reinterpret_cast<uintptr_t>(engine.node_map[i]);
+    return any == 0;
+}
+
+// The cells of a stroke and what becomes of them.
+struct front_cells_of {
+    explicit front_cells_of(const ER_selection& engine)
+        : side(brush_side(engine)),
+          count(static_cast<uint32_t>(front_cells(static_cast<uint64_t>(side)))),
+          cells(reinterpret_cast<front_cell*>(engine.node_pool)),
+          won(reinterpret_cast<unsigned char*>(cells + count)) {}
+
+    const ptrdiff_t side;
+    const uint32_t count;
+    front_cell* const cells;
+    unsigned char* const won;  // front_mark of each cell
+};
+
+// Opens the cells that fronts may enter and queues the seeds.
+template <class Rules, int KNOWN>
+front_queue<KNOWN> begin(const stroke_place& s, const front_cells_of& f) {
+    ze_memset(f.won, NOT_POPPED, f.count);
+    front_queue<KNOWN> queue(f.cells, f.count, f.won,
+                             slots_of_pool(s.engine.node_pool, static_cast<uint64_t>(f.side),
+                                           s.engine.brush_cells),
+                             s.engine.queue->step);
+    uint32_t next = 0;
+    const auto close_until = [&](uint32_t cell) {
+        for (; next < cell; ++next) f.cells[next].cost = CLOSED;
+    };
+    const ze_rect seeded = s.square(Rules::UNSEEDED_EDGE);
+    for (int py = seeded.top; py <= seeded.bottom; ++py) {
+        const ptrdiff_t row = s.cell_at(seeded.left, py);
+        const unsigned char* const classes = s.engine.brush_map + row;
+        const unsigned char* const pixels = s.mask + s.pixel_at(seeded.left, py);
+        close_until(static_cast<uint32_t>(f.side + row));
+        for (int i = 0; i <= seeded.right - seeded.left; ++i, ++next) {
+            front_cell& cell = f.cells[next];
+            const bool is_open = Rules::is_open(pixels[i]);
+            cell.cost = classes[i] == BRUSH_INNER && is_open ? UNREACHED : CLOSED;
+            if (classes[i] != BRUSH_CORE && classes[i] != BRUSH_RIM) continue;
+            const bool is_core = classes[i] == BRUSH_CORE;
+            if (!is_core && pixels[i] != Rules::SEED_VALUE) continue;
+            cell.cost = UNREACHED;
+            cell.front = !is_open ? BLOCKED_SEED : is_core ? STROKE_FRONT : KEEP_FRONT;
+            queue.reach(next, 0);
+        }
+    }
+    close_until(f.count - QUEUE_CELLS);
+    return queue;
+}
+
+// Finalises the cheapest cell, offers its neighbours to its front, and so on until the queue is
+// empty. Returns the number of cells reached, or -1 when the order of cells is in doubt.
+template <int KNOWN>
+int grow(const ER_selection& engine, const front_cells_of& f, front_queue<KNOWN> queue) {
+    front_cell* const cells = f.cells;
+    unsigned char* const won = f.won;
+    const int* const cost_h = engine.cost_h;
+    const int* const cost_v = engine.cost_v;
+    const uint32_t row = static_cast<uint32_t>(f.side);
+    while (!queue.empty()) {
+        const uint32_t cell = queue.pop();
+        const int cost = cells[cell].cost;
+        if (cost > HIGHEST_COST) {
+            queue.clear();
+            return -1;
+        }
+        const int front = cells[cell].front;
+        won[cell] = static_cast<unsigned char>(front);
+        if (front == BLOCKED_SEED) continue;
+
+        // The cells that it reaches at a lower cost, in order. A step's cost stands in the right or
+        // lower cell of the two.
+        uint32_t reached[4];
+        int reached_cost[4];
+        int count = 0;
+        const auto offer = [&](uint32_t neighbour, int step_cost) {
+            const int new_cost = wrap_add(cost, step_cost);
+            reached[count] = neighbour;
+            reached_cost[count] = new_cost;
+            count += new_cost < cells[neighbour].cost;
+        };
+        const uint32_t place = cell - row;
+        offer(cell - 1, cost_h[place]);
+        offer(cell + 1, cost_h[place + 1]);
+        offer(cell - row, cost_v[place]);
+        offer(cell + row, cost_v[place + row]);
+        for (int i = 0; i < count; ++i) {
+            cells[reached[i]].front = front;
+            queue.reach(reached[i], reached_cost[i]);
+        }
+    }
+    return queue.in_doubt() ? -1 : queue.taken();
+}
+
+// Gives a pixel its final value; true when rect takes it in.
 template <class Rules>
-void compete(ER_selection* engine, int* image, unsigned char* mask, int width, int height, int x,
-             int y, ze_rect* rect) {
-    if (!has_buffers(*engine) || !Rules::may_start(mask, width, height, x, y)) return;
-    competition<Rules> stroke(engine, image, mask, width, height, x, y);
-    stroke.reset();
-    if (!stroke.price_and_seed()) return;
-    stroke.grow();
-    stroke.settle(rect);
+bool settle_pixel(unsigned char* pixel, unsigned char mark) {
+    if (mark == STROKE_FRONT) *pixel = mark_of<Rules>(1, *pixel);
+    if (mark == KEEP_FRONT) *pixel = mark_of<Rules>(0, *pixel);
+    return Rules::settle(pixel);
+}
+
+// Writes into the mask what has been won.
+template <class Rules>
+void settle(const stroke_place& s, const front_cells_of& f, ze_rect* rect) {
+    const ze_rect all = s.square(0);
+    for (int py = all.top; py <= all.bottom; ++py) {
+        unsigned char* const pixels = s.mask + s.pixel_at(all.left, py);
+        unsigned char* const marks = f.won + f.side + s.cell_at(all.left, py);
+        const int count = all.right - all.left + 1;
+        for (int i = 0; i < count; ++i) marks[i] = settle_pixel<Rules>(pixels + i, marks[i]);
+        const unsigned char* const first = std::find(marks, marks + count, 1);
+        if (first == marks + count) continue;
+        const unsigned char* last = marks + count - 1;
+        while (*last == 0) --last;
+        include(rect, all.left + static_cast<int>(first - marks), py);
+        include(rect, all.left + static_cast<int>(last - marks), py);
+    }
+}
+
+// Carries the stroke out, or returns false, with nothing done, when its order is in doubt.
+template <class Rules, int KNOWN>
+bool decided(const stroke_place& s, ze_rect* rect) {
+    const front_cells_of f(s.engine);
+    const int reached = grow(s.engine, f, begin<Rules, KNOWN>(s, f));
+    if (reached < 0) return false;
+    settle<Rules>(s, f, rect);
+    s.engine.nodes_used = reached;
+    D_Queue& queue = *s.engine.queue;
+    queue.count = 0;
+    ze_memset(queue.index, 0, QUEUE_INDEX_ENTRIES * sizeof(node*));
+    if (Rules::CLEARS_SPARE) queue.spare = 0;
+    return true;
+}
+
+template <class Rules>
+stroke_run compete(const stroke_place& s, ze_rect* rect) {
+    const ptrdiff_t side = brush_side(s.engine);
+    if (s.engine.queue->head || !node_map_is_empty(s.engine, side * side)) return stroke_run::PLAIN;
+    const ze_rect seeded = s.square(Rules::UNSEEDED_EDGE);
+    if (!old_costs_are_sound(s, seeded)) return stroke_run::PLAIN;
+    price(s, seeded);
+    if (decided<Rules, 1>(s, rect)) return stroke_run::FIRST;
+    if (decided<Rules, 4>(s, rect)) return stroke_run::SECOND;
+    return stroke_run::PLAIN;
 }
 
 }  // namespace
 
+stroke_run run_growing(ER_selection* engine, int* image, unsigned char* mask, int width, int height,
+                       int x, int y, ze_rect* rect) {
+    if (!has_buffers(*engine) || !growing::may_start(mask, width, height, x, y)) {
+        return stroke_run::NONE;
+    }
+    const stroke_run run = compete<growing>({*engine, image, mask, width, height, x, y}, rect);
+    if (run == stroke_run::PLAIN) {
+        plain::DoSelection(engine, image, mask, width, height, x, y, rect);
+    }
+    return run;
+}
+
+stroke_run run_shrinking(ER_selection* engine, int* image, unsigned char* mask, int width,
+                         int height, int x, int y, ze_rect* rect) {
+    if (!has_buffers(*engine) || !shrinking::may_start(mask, width, height, x, y)) {
+        return stroke_run::NONE;
+    }
+    const stroke_run run = compete<shrinking>({*engine, image, mask, width, height, x, y}, rect);
+    if (run == stroke_run::PLAIN) {
+        plain::DeSelection(engine, image, mask, width, height, x, y, rect);
+    }
+    return run;
+}
+
 void ER_selection::DoSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
                                ze_rect* rect) {
-    compete<growing>(this, image, mask, width, height, x, y, rect);
+    run_growing(this, image, mask, width, height, x, y, rect);
 }
 
 void ER_selection::DeSelection(int* image, unsigned char* mask, int width, int height, int x, int y,
                                ze_rect* rect) {
-    compete<shrinking>(this, image, mask, width, height, x, y, rect);
+    run_shrinking(this, image, mask, width, height, x, y, rect);
 }

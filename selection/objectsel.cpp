@@ -1,8 +1,11 @@
 #include "selection/objectsel.h"
 
+#include <algorithm>
 #include <cstddef>
+#include <cstring>
 #include <new>
 
+#include "render/row_kernels.h"
 #include "selection/region_shaping.h"
 #include "support/log.h"
 #include "support/ze_alloc.h"
@@ -37,6 +40,37 @@ void complete_regions(unsigned char* mask, int width, int height, int mode, ze_r
         default:  // ERASE has none
             break;
     }
+}
+
+// Index of the first selected one of n pixels, or n.
+int first_selected(const unsigned char* pixels, int n) {
+    const void* const found = std::memchr(pixels, 1, static_cast<size_t>(n));
+    return found ? static_cast<int>(static_cast<const unsigned char*>(found) - pixels) : n;
+}
+
+// Widens *box over the selected pixels of a rectangle that lies in the mask.
+//
+// Rows are read from the top down to one with a selected pixel, and from the bottom up to one; of
+// those between, only what lies left and right of all that has been found.
+void include_selected(const unsigned char* mask, int width, ze_rect area, ze_rect* box) {
+    if (area.left > area.right) return;
+    const row_kernels& kernels = row_kernels_of_this_cpu();
+    const auto row = [&](int y) { return mask + ptrdiff_t{y} * width + area.left; };
+    const int columns = area.right - area.left + 1;
+    while (area.top <= area.bottom && first_selected(row(area.top), columns) >= columns) ++area.top;
+    if (area.top > area.bottom) return;
+    while (kernels.last_selected(row(area.bottom), columns) < 0) --area.bottom;
+
+    int left = columns - 1;
+    int right = 0;
+    for (int y = area.top; y <= area.bottom; ++y) {
+        const unsigned char* const pixels = row(y);
+        left = std::min(left, first_selected(pixels, left));
+        const ptrdiff_t behind =
+            kernels.last_selected(pixels + right + 1, ptrdiff_t{columns} - right - 1);
+        right += static_cast<int>(behind + 1);
+    }
+    unite(box, {area.left + left, area.left + right, area.top, area.bottom});
 }
 
 void build_engine() {
@@ -107,13 +141,9 @@ void ze_modify_objectsel(int* pixels, unsigned char* mask, int width, int height
 
 void ze_inverse_mask(unsigned char* mask, int width, int height) {
     g_object_boundary = empty_at_last_pixel(width, height);
-    for (int y = 0; y < height; ++y) {
-        for (int x = 0; x < width; ++x) {
-            unsigned char& pixel = mask[ptrdiff_t{y} * width + x];
-            pixel = pixel != 1;
-            if (pixel == 1) include(&g_object_boundary, x, y);
-        }
-    }
+    if (width < 1 || height < 1) return;
+    row_kernels_of_this_cpu().invert(mask, ptrdiff_t{width} * height);
+    include_selected(mask, width, {0, width - 1, 0, height - 1}, &g_object_boundary);
 }
 
 void ze_set_objectROI(ze_rect roi) { g_object_boundary = roi; }
@@ -123,11 +153,7 @@ ze_rect ze_get_objectROI() { return g_object_boundary; }
 void ze_update_objectROI(unsigned char* mask, int width, int height) {
     const ze_rect old = clip_to_image(g_object_boundary, width, height);
     g_object_boundary = empty_beyond_image(width, height);
-    for (int y = old.top; y <= old.bottom; ++y) {
-        for (int x = old.left; x <= old.right; ++x) {
-            if (mask[ptrdiff_t{y} * width + x] == 1) include(&g_object_boundary, x, y);
-        }
-    }
+    include_selected(mask, width, old, &g_object_boundary);
 }
 
 void ze_reset_fill_boundary(int width, int height) {

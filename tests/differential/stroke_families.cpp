@@ -1,4 +1,6 @@
 #include "selection/ER_selection.h"
+#include "selection/competition_plain.h"
+#include "selection/front_competition.h"
 #include "tests/differential/family.h"
 #include "tests/differential/placed_vector.h"
 #include "tests/differential/random_pictures.h"
@@ -135,6 +137,54 @@ void run_tiny_shrink(random_source& random, findings* found) {
     run_tiny_strokes(random, found, &ER_selection::DeSelection, &reference::engine::DeSelection);
 }
 
+// Strokes of the brush that the library runs, against the plain competition of fronts; for brushes
+// too large for the model.
+void run_competition(random_source& random, findings* found) {
+    const int radius = random.one_in(2) ? random.between(1, 12) : random.between(1, 80);
+    const int core = random_core(random, radius);
+    ER_selection engine, plain_engine;
+    engine.initial(radius, core);
+    plain_engine.initial(radius, core);
+    scene s{random, random.size_up_to(200), random.size_up_to(200)};
+    if (random.one_in(3)) sprinkle(random, &s.model_mask, 0, random.any_of({1, 4, 5, 255}));
+    s.share_mask();
+    for (int strokes = random.between(1, 6); strokes > 0 && found->agree(); --strokes) {
+        const position at = {random.between(-1, s.width), random.between(-1, s.height)};
+        const bool grows = random.one_in(2);
+        ze_rect changed = empty_beyond_image(s.width, s.height);
+        ze_rect expected = changed;
+        const auto run = grows ? run_growing : run_shrinking;
+        const auto plain_run = grows ? plain::DoSelection : plain::DeSelection;
+        const stroke_run carried_out = run(&engine, s.library_photo.data(), s.mask.data(), s.width,
+                                           s.height, at.x, at.y, &changed);
+        plain_run(&plain_engine, s.photo.data(), s.model_mask.data(), s.width, s.height, at.x, at.y,
+                  &expected);
+        if (carried_out != stroke_run::NONE) found->count("strokes");
+        if (carried_out == stroke_run::SECOND) found->count("strokes that took a second queue");
+        if (carried_out == stroke_run::PLAIN) found->count("strokes left to the plain version");
+        found->compare(
+            "rectangle", changed,
+            reference::rect{expected.left, expected.right, expected.top, expected.bottom});
+        found->compare("nodes_used", engine.nodes_used, plain_engine.nodes_used);
+        found->compare("count in the queue", engine.queue->count, plain_engine.queue->count);
+        found->compare("list in the queue", engine.queue->head != nullptr,
+                       plain_engine.queue->head != nullptr);
+        found->compare_arrays("mask", s.mask, s.model_mask);
+    }
+    const ptrdiff_t cells = brush_side(engine) * brush_side(engine);
+    const auto costs_of = [cells](const int* costs) {
+        return std::vector<int>(costs, costs + cells);
+    };
+    found->compare_arrays("cost_h", costs_of(engine.cost_h), costs_of(plain_engine.cost_h));
+    found->compare_arrays("cost_v", costs_of(engine.cost_v), costs_of(plain_engine.cost_v));
+    std::vector<int> recorded(static_cast<size_t>(cells)), expected_recorded(recorded);
+    for (ptrdiff_t i = 0; i < cells; ++i) {
+        recorded[static_cast<size_t>(i)] = engine.node_map[i] != nullptr;
+        expected_recorded[static_cast<size_t>(i)] = plain_engine.node_map[i] != nullptr;
+    }
+    found->compare_arrays("node_map", recorded, expected_recorded);
+}
+
 // Calls for strokes that look at the mask alone.
 using mask_call = void (ER_selection::*)(unsigned char*, int, int, int, int, ze_rect*);
 using model_mask_call = void (reference::engine::*)(std::vector<unsigned char>&, int, int, int, int,
@@ -196,6 +246,8 @@ const std::vector<family> stroke_families = {
     {"shrink", "shrinking strokes, likewise", 32000, run_shrink},
     {"tiny-grow", "20 growing strokes each on tiny photos with walls", 2000, run_tiny_grow},
     {"tiny-shrink", "20 shrinking strokes, likewise", 5000, run_tiny_shrink},
+    {"competition", "both kinds of strokes against plain ones, radius 1 to 80", 3000,
+     run_competition},
     {"painting", "Brush_Add and Brush_Del", 100000, run_painting},
     {"lasso", "segments of adding and removing lassos", 100000, run_lasso},
 };

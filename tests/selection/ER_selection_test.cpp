@@ -6,6 +6,7 @@
 #include <climits>
 #include <vector>
 
+#include "selection/competition_memory.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"
 #include "tests/helpers/rect_printing.h"
@@ -191,17 +192,21 @@ TEST(ER_selection_initial, BeginsWithAnEmptyQueueAndNoNodesUsed) {
     EXPECT_EQ(b.nodes_used, 0);
 }
 
-TEST(ER_selection_initial, TakesAnEntryPerCellAndARecordMoreThanTheBrushHasCells) {
+TEST(ER_selection_initial, TakesAnEntryPerCellAndWhatTheCompetitionNeeds) {
     const struct {
         int radius;
         size_t square, brush;
-    } cases[] = {{2, 25, 21}, {0, 1, 1}, {-1, 0, 0}, {-2, 0, 0}};
+    } cases[] = {{10, 441, 349}, {2, 25, 21}, {0, 1, 1}, {-1, 0, 0}, {-2, 0, 0}};
     for (const auto& c : cases) {
         const failing_allocations counted(0);
         const brush b(c.radius, 1);
-        EXPECT_EQ(counted.bytes(), sizeof(D_Queue) + 100 * sizeof(node*) +
-                                       c.square * (1 + sizeof(node*) + 2 * sizeof(int)) +
-                                       (c.brush + 1) * sizeof(node))
+        const size_t needed = sizeof(D_Queue) + 100 * sizeof(node*) +
+                              c.square * (1 + sizeof(node*) + 2 * sizeof(int)) +
+                              (c.brush + 1) * sizeof(node);
+        EXPECT_GE(counted.bytes(), needed + sizeof(cost_slots)) << c.radius;
+        // A cell's record in the competition takes less than 32 bytes; and there are some more.
+        const size_t side = c.radius < 0 ? 0 : 2 * static_cast<size_t>(c.radius) + 1;
+        EXPECT_LE(counted.bytes(), needed + sizeof(cost_slots) + 32 * (c.square + 3 * side + 8))
             << c.radius;
     }
 }

@@ -19,6 +19,7 @@
 #include <vector>
 
 #include "selection/ER_selection.h"
+#include "selection/competition_plain.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"
 #include "tests/helpers/rect_printing.h"
@@ -266,10 +267,12 @@ TEST(DoSelection, LeavesATieToTheFrontThatArrivedFirst) {
 }
 
 TEST(DoSelection, VisitsNeighboursLeftRightUpDown) {
-    // With a core of one pixel and no rim seeds, the first five records tell.
+    // With a core of one pixel and no rim seeds, the plain version's first five records tell.
     engine e(3, 0);
     Picture mask(7, 7, 1);
-    e.grow(FLAT, &mask, 3, 3);
+    std::vector<int> photo(49);
+    ze_rect rect = {7, 0, 7, 0};
+    plain::DoSelection(&e, photo.data(), mask.data(), 7, 7, 3, 3, &rect);
     const struct { int x, y; } order[] = {{3, 3}, {2, 3}, {4, 3}, {3, 2}, {3, 4}};
     for (int i = 0; i < 5; ++i) {
         EXPECT_EQ(e.node_pool[i].x, order[i].x) << i;

@@ -1,0 +1,58 @@
+#include "jni/photo_columns.h"
+
+#include <algorithm>
+
+photo_columns::photo_columns(int32_t first, int32_t step_size, int n, int photo_width)
+    : kernels(row_kernels_of_this_cpu()),
+      step(step_size),
+      count(n),
+      last_column(clamp_to_photo(int64_t{photo_width} - 1, photo_width)) {
+    for (int i = 0; i < n; ++i) columns[i] = whole(wrap_add(first, wrap_mul(i, step)));
+    inside = first_from(0);
+    beyond = std::max(first_from(photo_width), inside);
+}
+
+int photo_columns::first_from(int column) const {
+    return static_cast<int>(std::lower_bound(columns, columns + count, column) - columns);
+}
+
+void photo_columns::show(const int32_t* photo_row, int32_t* to) const { show_row(photo_row, to); }
+
+void photo_columns::show(const uint8_t* mask_row, uint8_t* to) const { show_row(mask_row, to); }
+
+template <class T>
+void photo_columns::show_row(const T* row, T* to) const {
+    std::fill(to, to + inside, row[0]);
+    if (inside < beyond) show_inside(row, columns + inside, beyond - inside, to + inside);
+    std::fill(to + beyond, to + count, row[last_column]);
+}
+
+void photo_columns::show_inside(const int32_t* row, const int32_t* shown, int n,
+                                int32_t* to) const {
+    if (step == ONE_PIXEL) {
+        std::copy_n(row + shown[0], n, to);
+    } else if (step == HALF_PIXEL) {
+        const int alone =
+            n > 1 && shown[0] != shown[1];  // of the first photo pixel the second half
+        to[0] = row[shown[0]];
+        kernels.double_pixels(row + shown[alone], to + alone, n - alone);
+    } else {
+        kernels.gather_pixels(row, shown, to, n);
+    }
+}
+
+void photo_columns::show_inside(const uint8_t* row, const int32_t* shown, int n,
+                                uint8_t* to) const {
+    if (step == ONE_PIXEL) {
+        std::copy_n(row + shown[0], n, to);
+    } else {
+        kernels.gather_bytes(row, shown, to, n);
+    }
+}
+
+void show_unscaled(const int32_t* photo_row, int photo_width, int32_t* to, int64_t columns) {
+    const int64_t last = clamp_to_photo(int64_t{photo_width} - 1, photo_width);
+    const int64_t before_last = std::min(columns, last);
+    std::copy_n(photo_row, before_last, to);
+    std::fill(to + before_last, to + columns, photo_row[last]);
+}
