@@ -13,8 +13,8 @@
 #include "selection/D_Queue.h"
 #include "selection/colour_cost.h"
 
-// A cell of the brush square. Cells are known by number; the square's begin at `side`, between two
-// rows of closed ones, and the queue has some of its own behind them.
+// A cell of the brush square. Cells are known by number: first come two of the queue's own, then
+// the square's, row by row, with a closed row before and one behind.
 struct front_cell {
     int cost;   // of its path; CLOSED or UNREACHED
     int front;  // who brought it there: front_mark
@@ -46,11 +46,17 @@ struct cost_slots {
     uint32_t first[COST_SLOTS];  // of used slots only
 };
 
-constexpr int QUEUE_CELLS = 4;
+// The queue's own cells, so that no link needs a condition.
+constexpr uint32_t LIST_END = 0;    // behind the tail, which is its `previous`; also for null
+constexpr uint32_t LIST_START = 1;  // before the head, which is its `next`
+constexpr uint32_t QUEUE_CELLS = 2;
 
-inline uint64_t front_cells(uint64_t side) { return side * side + 2 * side + QUEUE_CELLS; }
+inline uint64_t first_of_square(uint64_t side) { return QUEUE_CELLS + side; }
+inline uint64_t front_cells(uint64_t side) { return first_of_square(side) + side * side + side; }
 
-inline uint64_t nodes_that_hold(uint64_t bytes) { return (bytes + sizeof(node) - 1) / sizeof(node); }
+inline uint64_t nodes_that_hold(uint64_t bytes) {
+    return (bytes + sizeof(node) - 1) / sizeof(node);
+}
 
 // Entries of node_pool before the slots.
 inline uint64_t nodes_before_slots(uint64_t side, int brush_cells) {

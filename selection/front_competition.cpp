@@ -101,11 +101,13 @@ bool node_map_is_empty(const ER_selection& engine, ptrdiff_t cells) {
 struct front_cells_of {
     explicit front_cells_of(const ER_selection& engine)
         : side(brush_side(engine)),
+          first(static_cast<uint32_t>(first_of_square(static_cast<uint64_t>(side)))),
           count(static_cast<uint32_t>(front_cells(static_cast<uint64_t>(side)))),
           cells(reinterpret_cast<front_cell*>(engine.node_pool)),
           won(reinterpret_cast<unsigned char*>(cells + count)) {}
 
     const ptrdiff_t side;
+    const uint32_t first;  // of the square
     const uint32_t count;
     front_cell* const cells;
     unsigned char* const won;  // front_mark of each cell
@@ -115,11 +117,11 @@ struct front_cells_of {
 template <class Rules, int KNOWN>
 front_queue<KNOWN> begin(const stroke_place& s, const front_cells_of& f) {
     ze_memset(f.won, NOT_POPPED, f.count);
-    front_queue<KNOWN> queue(f.cells, f.count, f.won,
-                             slots_of_pool(s.engine.node_pool, static_cast<uint64_t>(f.side),
-                                           s.engine.brush_cells),
-                             s.engine.queue->step);
-    uint32_t next = 0;
+    front_queue<KNOWN> queue(
+        f.cells, f.won,
+        slots_of_pool(s.engine.node_pool, static_cast<uint64_t>(f.side), s.engine.brush_cells),
+        s.engine.queue->step);
+    uint32_t next = QUEUE_CELLS;
     const auto close_until = [&](uint32_t cell) {
         for (; next < cell; ++next) f.cells[next].cost = CLOSED;
     };
@@ -128,7 +130,7 @@ front_queue<KNOWN> begin(const stroke_place& s, const front_cells_of& f) {
         const ptrdiff_t row = s.cell_at(seeded.left, py);
         const unsigned char* const classes = s.engine.brush_map + row;
         const unsigned char* const pixels = s.mask + s.pixel_at(seeded.left, py);
-        close_until(static_cast<uint32_t>(f.side + row));
+        close_until(f.first + static_cast<uint32_t>(row));
         for (int i = 0; i <= seeded.right - seeded.left; ++i, ++next) {
             front_cell& cell = f.cells[next];
             const bool is_open = Rules::is_open(pixels[i]);
@@ -141,7 +143,7 @@ front_queue<KNOWN> begin(const stroke_place& s, const front_cells_of& f) {
             queue.reach(next, 0);
         }
     }
-    close_until(f.count - QUEUE_CELLS);
+    close_until(f.count);
     return queue;
 }
 
@@ -151,9 +153,11 @@ template <int KNOWN>
 int grow(const ER_selection& engine, const front_cells_of& f, front_queue<KNOWN> queue) {
     front_cell* const cells = f.cells;
     unsigned char* const won = f.won;
+    const uint32_t row = static_cast<uint32_t>(f.side);
     const int* const cost_h = engine.cost_h;
     const int* const cost_v = engine.cost_v;
-    const uint32_t row = static_cast<uint32_t>(f.side);
+    const int* const cost_v_below = cost_v + row;
+    const size_t first = f.first;
     while (!queue.empty()) {
         const uint32_t cell = queue.pop();
         const int cost = cells[cell].cost;
@@ -176,14 +180,14 @@ int grow(const ER_selection& engine, const front_cells_of& f, front_queue<KNOWN>
             reached_cost[count] = new_cost;
             count += new_cost < cells[neighbour].cost;
         };
-        const uint32_t place = cell - row;
+        const size_t place = size_t{cell} - first;
         offer(cell - 1, cost_h[place]);
         offer(cell + 1, cost_h[place + 1]);
         offer(cell - row, cost_v[place]);
-        offer(cell + row, cost_v[place + row]);
+        offer(cell + row, cost_v_below[place]);
         for (int i = 0; i < count; ++i) {
-            cells[reached[i]].front = front;
             queue.reach(reached[i], reached_cost[i]);
+            cells[reached[i]].front = front;
         }
     }
     return queue.in_doubt() ? -1 : queue.taken();
@@ -203,7 +207,7 @@ void settle(const stroke_place& s, const front_cells_of& f, ze_rect* rect) {
     const ze_rect all = s.square(0);
     for (int py = all.top; py <= all.bottom; ++py) {
         unsigned char* const pixels = s.mask + s.pixel_at(all.left, py);
-        unsigned char* const marks = f.won + f.side + s.cell_at(all.left, py);
+        unsigned char* const marks = f.won + f.first + s.cell_at(all.left, py);
         const int count = all.right - all.left + 1;
         for (int i = 0; i < count; ++i) marks[i] = settle_pixel<Rules>(pixels + i, marks[i]);
         const unsigned char* const first = std::find(marks, marks + count, 1);

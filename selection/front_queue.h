@@ -34,23 +34,15 @@
 template <int KNOWN>
 class front_queue {
 public:
-    // An empty queue of cells below `cell_count` - QUEUE_CELLS. `popped` says which have been
-    // popped: not NOT_POPPED. REQUIRES: no slot is used.
-    front_queue(front_cell* all_cells, uint32_t cell_count, const unsigned char* popped_cells,
-                cost_slots* slots_of_costs, int index_step)
-        : cells(all_cells),
-          popped(popped_cells),
-          slots(*slots_of_costs),
-          step(index_step),
-          end(cell_count - 4),
-          none(cell_count - 3),
-          start(cell_count - 2),
-          nowhere(cell_count - 1) {
-        cells[end] = {INT32_MAX, 0, none, none};
-        cells[none] = {INT32_MAX, 0, none, none};
-        cells[start] = {CLOSED, 0, none, end};
+    // An empty queue. `popped_cells` says which cells have been: any value but NOT_POPPED.
+    // REQUIRES: no slot is used.
+    front_queue(front_cell* all_cells, const unsigned char* popped_cells, cost_slots* all_slots,
+                int index_step)
+        : cells(all_cells), popped(popped_cells), slots(*all_slots), step(index_step) {
+        cells[LIST_END] = {INT32_MAX, 0, LIST_START, LIST_END};
+        cells[LIST_START] = {CLOSED, 0, LIST_START, LIST_END};
         for (int k = 0; k < KNOWN; ++k) {
-            known[k] = none;
+            known[k] = LIST_END;
             // A count that does not fit is never reached.
             marks[k] = static_cast<int>(std::min(int64_t{step} * (k + 1), int64_t{INT32_MAX}));
         }
@@ -70,36 +62,33 @@ public:
         const bool was_alone = count == 1;
         if (is_new) {
             ++pushed;
-            cells[cell].previous = none;
+            cells[cell].previous = LIST_END;
         } else {
             unlink(cell);
         }
         insert(cell, cost);
         for (int k = 0; k < KNOWN; ++k) {
             // One alone is lowered where it is, and the index does not hear of it.
-            if (count == marks[k] && (is_new || !was_alone)) known[k] = cells[end].previous;
+            if (count == marks[k] && (is_new || !was_alone)) known[k] = cells[LIST_END].previous;
         }
     }
 
     // Removes and returns the cheapest cell. REQUIRES: !empty().
     [[gnu::always_inline]] uint32_t pop() {
-        const uint32_t cheapest = cells[start].next;
+        const uint32_t cheapest = cells[LIST_START].next;
         const uint32_t head = cells[cheapest].next;
-        cells[start].next = head;
-        cells[head].previous = none;
+        cells[LIST_START].next = head;
+        cells[head].previous = LIST_END;
         const int cost = cells[cheapest].cost;
         slots.first[slot_of(cost)] = head;
         free_slot(slot_of(cost), cells[head].cost != cost);
         --count;
-        bool used = true;
+        bool used = true;  // an entry behind a null one is not
         for (uint32_t& entry : known) {
-            const uint32_t next = cells[entry].next;
-            const uint32_t moved = next == end ? none : next;
-            const uint32_t old = entry;
-            entry = used ? moved : old;
-            used &= old != none;
+            used &= entry != LIST_END;
+            entry = used ? cells[entry].next : entry;
         }
-        // With no head, the walk from a popped cell would end nowhere; `end` is dearer than any.
+        // With no head, the walk from a popped cell would end nowhere; LIST_END is dearer than any.
         dearest_head = std::max(dearest_head, cells[head].cost);
         return cheapest;
     }
@@ -115,11 +104,11 @@ private:
 
     // Deliberate: the next head keeps its `previous`, as in D_Queue.
     void unlink(uint32_t cell) {
-        const bool is_head = cells[start].next == cell;
+        const bool is_head = cells[LIST_START].next == cell;
         const uint32_t next = cells[cell].next;
-        const uint32_t ahead = is_head ? start : cells[cell].previous;
+        const uint32_t ahead = is_head ? LIST_START : cells[cell].previous;
         cells[ahead].next = next;
-        cells[is_head ? nowhere : next].previous = ahead;
+        cells[is_head ? LIST_START : next].previous = ahead;
         const int cost = cells[cell].cost;
         uint32_t& first = slots.first[slot_of(cost)];
         const bool was_first = first == cell;
@@ -136,7 +125,7 @@ private:
             behind = first_from(cost);
             enter_slot(cell);
         } else {
-            behind = end;
+            behind = LIST_END;
             if (count > 0) {
                 behind = first_from(cost + 1);
             } else if (pushed <= int64_t{2} * step) {
@@ -144,11 +133,11 @@ private:
             }
             if (!is_used(slot_of(cost))) enter_slot(cell);
             // Deliberate: a new head of two or more becomes its own `previous`, as in D_Queue.
-            if (count >= 2 && behind == cells[start].next) cells[cell].previous = cell;
+            if (count >= 2 && behind == cells[LIST_START].next) cells[cell].previous = cell;
         }
         // A new head keeps its `previous`.
-        const bool is_head = behind == cells[start].next;
-        const uint32_t ahead = is_head ? start : cells[behind].previous;
+        const bool is_head = behind == cells[LIST_START].next;
+        const uint32_t ahead = is_head ? LIST_START : cells[behind].previous;
         cells[ahead].next = cell;
         cells[cell].next = behind;
         cells[behind].previous = cell;
@@ -160,21 +149,20 @@ private:
     void pass_index(int cost) {
         bool used = true;
         bool passed = false;  // an entry that is null or not cheaper
-        uint32_t anchor = none;
+        uint32_t anchor = LIST_END;
         for (uint32_t& entry : known) {
-            const uint32_t old = entry;
-            passed |= cells[old].cost >= cost;
-            anchor = passed ? anchor : old;
-            entry = (passed & used) ? cells[old].previous : old;
-            used &= old != none;
+            used &= entry != LIST_END;
+            passed |= cells[entry].cost >= cost;
+            anchor = passed ? anchor : entry;
+            entry = (used & passed) ? cells[entry].previous : entry;
         }
         if (cost <= dearest_head) doubt |= !passed | (KNOWN > 1 && popped[anchor] != NOT_POPPED);
     }
 
-    // The first cell of at least this cost, or `end`. REQUIRES: !empty().
+    // The first cell of at least this cost, or LIST_END. REQUIRES: !empty().
     uint32_t first_from(int cost) const {
         const uint32_t found = slots.first[next_used(slot_of(cost))];
-        return cells[found].cost < cost ? end : found;
+        return cells[found].cost < cost ? LIST_END : found;
     }
 
     // The first used slot from `slot` on, going round.
@@ -187,7 +175,8 @@ private:
             word += 1 + lowest_bit(after);
         } else {
             uint32_t group = word / 64;
-            do group = (group + 1) % 64; while (!slots.used_words[group]);
+            do group = (group + 1) % 64;
+            while (!slots.used_words[group]);
             word = group * 64 + lowest_bit(slots.used_words[group]);
         }
         return word * 64 + lowest_bit(slots.used[word]);
@@ -221,12 +210,6 @@ private:
     int pushed = 0;
     int dearest_head = CLOSED;  // none yet
     bool doubt = false;
-    uint32_t known[KNOWN];  // of D_Queue's index, the first entries; `none` is null
+    uint32_t known[KNOWN];  // of D_Queue's index, the first entries; LIST_END is null
     int marks[KNOWN];       // the counts at which they are set
-
-    // Cells of the queue's own, so that no link needs a condition.
-    const uint32_t end;      // behind the tail, which is its `previous`; dearer than any
-    const uint32_t none;     // stands for null; dearer than any, and leads to itself
-    const uint32_t start;    // before the head, which is its `next`
-    const uint32_t nowhere;  // takes what is written in vain
 };

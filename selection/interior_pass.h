@@ -125,7 +125,8 @@ private:
             }
             if (at.word > last_word()) {
                 at = {at.row + 1, first_word()};
-                if (!Rules::CROSSES_ROWS || at.row > area.bottom) return at;
+                if constexpr (!Rules::CROSSES_ROWS) return at;
+                if (at.row > area.bottom) return at;
             }
         }
     }

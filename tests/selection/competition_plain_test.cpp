@@ -124,6 +124,16 @@ TEST(Competition, OfSmallBrushesIsThePlainOne) {
     }
 }
 
+// Strokes in which D_Queue's index names popped nodes where it matters. One in a thousand of those
+// with tiny brushes and foreign values comes to that.
+TEST(Competition, ThatBreaksTheOrderIsCarriedOutPlainly) {
+    run_counts runs(4);
+    for (const unsigned seed : {1598u, 1704u, 1850u, 2050u, 3100u, 3957u}) {
+        ASSERT_NO_FATAL_FAILURE(expect_equal_strokes(seed, 9, &runs));
+    }
+    EXPECT_GT(runs[static_cast<size_t>(stroke_run::PLAIN)], 0);
+}
+
 TEST(Competition, OfLargeBrushesIsThePlainOne) {
     run_counts runs(4);
     for (unsigned seed = 1; seed <= 150; ++seed) {
@@ -179,6 +189,31 @@ TEST(Competition, TakesOldCostsUpToTheDearestStep) {
     EXPECT_EQ(engines.stroke(true, flat_photo(mask), &mask, 1, 1), stroke_run::FIRST);
 }
 
+// A corridor winds out from the core so far that the cost of its path wraps: every step is the
+// dearest, from black to white or back.
+TEST(Competition, WithPathsTooDearToCountIsCarriedOutPlainly) {
+    const int radius = 130, size = 2 * radius + 3, centre = radius + 1;
+    Picture mask(size, size, 5);  // closed to both fronts
+    const struct { int x, y; } turns[] = {{1, 0}, {0, 1}, {-1, 0}, {0, -1}};
+    int x = centre, y = centre, steps = 0;
+    mask.at(x, y) = 0;
+    for (int side = 0; side < 172; ++side) {
+        for (int i = 0; i < 2 * (side / 2 + 1); ++i, ++steps) {
+            x += turns[side % 4].x;
+            y += turns[side % 4].y;
+            mask.at(x, y) = 0;
+        }
+    }
+    ASSERT_GT(int64_t{steps} * 3 * 255 * 255, INT_MAX);
+    std::vector<int> photo;
+    for (int i = 0; i < size * size; ++i) photo.push_back((i % 2) * 0xFFFFFF);  // size is odd
+    engine_pair engines(radius, 0);
+    EXPECT_EQ(engines.stroke(true, photo, &mask, centre, centre), stroke_run::PLAIN);
+    mask = Picture(size, size, 0);
+    EXPECT_EQ(engines.stroke(true, photo, &mask, centre, centre), stroke_run::FIRST)
+        << "nothing is left of the stroke given up";
+}
+
 // ---- strokes that do nothing
 
 TEST(Competition, DoesNothingWithoutBuffersOrAwayFromItsStart) {
@@ -190,6 +225,8 @@ TEST(Competition, DoesNothingWithoutBuffersOrAwayFromItsStart) {
               stroke_run::NONE);
     EXPECT_EQ(run_shrinking(&without_buffers, photo.data(), mask.data(), 5, 5, 2, 2, &rect),
               stroke_run::NONE);
+    plain::DoSelection(&without_buffers, photo.data(), mask.data(), 5, 5, 2, 2, &rect);
+    EXPECT_EQ(mask, Picture(5, 5, 0));
     engine_pair engines(1, 0);
     EXPECT_EQ(engines.stroke(true, photo, &mask, 0, 2), stroke_run::NONE);
     EXPECT_EQ(engines.stroke(false, photo, &mask, 2, 2), stroke_run::NONE) << "not selected";
