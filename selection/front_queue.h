@@ -156,7 +156,10 @@ private:
             anchor = passed ? anchor : entry;
             entry = (used & passed) ? cells[entry].previous : entry;
         }
-        if (cost <= dearest_head) doubt |= !passed | (KNOWN > 1 && popped[anchor] != NOT_POPPED);
+        if (cost > dearest_head) return;
+        doubt |= !passed;
+        // The first entry is never hidden by another, so its cell is never a popped one.
+        if constexpr (KNOWN > 1) doubt |= popped[anchor] != NOT_POPPED;
     }
 
     // The first cell of at least this cost, or LIST_END. REQUIRES: !empty().

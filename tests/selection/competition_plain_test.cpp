@@ -99,8 +99,9 @@ void expect_equal_strokes(unsigned seed, int largest_radius, run_counts* runs) {
             if (random.one_in(6)) pixel = static_cast<unsigned char>(random.between(0, foreign));
         }
         const int x = random.between(-1, width), y = random.between(-1, height);
-        const stroke_run run =
-            engines.stroke(random.one_in(2), random_photo(random, width, height), &mask, x, y);
+        const bool grows = random.one_in(2);
+        const std::vector<int> photo = random_photo(random, width, height);
+        const stroke_run run = engines.stroke(grows, photo, &mask, x, y);
         ++(*runs)[static_cast<size_t>(run)];
         if (::testing::Test::HasFailure()) {
             FAIL() << "seed " << seed << ", radius " << radius << ", at " << x << ", " << y;
@@ -116,7 +117,7 @@ std::vector<int> flat_photo(const Picture& mask) {
 
 TEST(Competition, OfSmallBrushesIsThePlainOne) {
     run_counts runs(4);
-    for (unsigned seed = 1; seed <= 4000; ++seed) {
+    for (unsigned seed = 1; seed <= 3000; ++seed) {
         ASSERT_NO_FATAL_FAILURE(expect_equal_strokes(seed, 9, &runs));
     }
     for (const stroke_run run : {stroke_run::NONE, stroke_run::FIRST, stroke_run::SECOND}) {
@@ -128,7 +129,7 @@ TEST(Competition, OfSmallBrushesIsThePlainOne) {
 // with tiny brushes and foreign values comes to that.
 TEST(Competition, ThatBreaksTheOrderIsCarriedOutPlainly) {
     run_counts runs(4);
-    for (const unsigned seed : {1598u, 1704u, 1850u, 2050u, 3100u, 3957u}) {
+    for (const unsigned seed : {1343u, 1459u, 2089u, 3092u, 4711u, 6037u}) {
         ASSERT_NO_FATAL_FAILURE(expect_equal_strokes(seed, 9, &runs));
     }
     EXPECT_GT(runs[static_cast<size_t>(stroke_run::PLAIN)], 0);

@@ -40,15 +40,18 @@ void draw_rectangle(Picture* mask, int left, int top, int width, int height, boo
 Picture random_mask(random_numbers& random) {
     // Rows of one word and of several, and images so narrow that their sides share markers.
     const int largest = random.one_in(3) ? 150 : random.one_in(2) ? 30 : 5;
-    Picture mask(random.between(1, largest), random.between(1, random.one_in(2) ? largest : 12), 0);
-    const int width = mask.width, height = mask.height;
+    const int width = random.between(1, largest);
+    const int height = random.between(1, random.one_in(2) ? largest : 12);
+    Picture mask(width, height, 0);
     const int kind = random.between(0, 4), share = random.between(1, 99),
               step = random.between(2, 5);
     if (kind == 1) {
         for (int count = random.between(1, 25); count > 0; --count) {
-            draw_rectangle(&mask, random.between(0, width - 1), random.between(0, height - 1),
-                           random.between(1, 1 + width / 3), random.between(1, 1 + height / 3),
-                           random.one_in(3), !random.one_in(4));
+            const int left = random.between(0, width - 1), top = random.between(0, height - 1);
+            const int across = random.between(1, 1 + width / 3);
+            const int down = random.between(1, 1 + height / 3);
+            const bool hollow = random.one_in(3);
+            draw_rectangle(&mask, left, top, across, down, hollow, !random.one_in(4));
         }
         return mask;
     }
