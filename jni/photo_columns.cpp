@@ -6,8 +6,12 @@ photo_columns::photo_columns(int32_t first, int32_t step_size, int n, int photo_
     : kernels(row_kernels_of_this_cpu()),
       step(step_size),
       count(n),
-      last_column(clamp_to_photo(int64_t{photo_width} - 1, photo_width)) {
-    for (int i = 0; i < n; ++i) columns[i] = whole(wrap_add(first, wrap_mul(i, step)));
+      last_column(clamp_to_photo(photo_width, photo_width)) {
+    std::generate_n(columns, n, [this, position = first]() mutable {
+        const int column = whole(position);
+        position = wrap_add(position, step);
+        return column;
+    });
     inside = first_from(0);
     beyond = std::max(first_from(photo_width), inside);
 }
@@ -51,7 +55,7 @@ void photo_columns::show_inside(const uint8_t* row, const int32_t* shown, int n,
 }
 
 void show_unscaled(const int32_t* photo_row, int photo_width, int32_t* to, int64_t columns) {
-    const int64_t last = clamp_to_photo(int64_t{photo_width} - 1, photo_width);
+    const int64_t last = clamp_to_photo(photo_width, photo_width);
     const int64_t before_last = std::min(columns, last);
     std::copy_n(photo_row, before_last, to);
     std::fill(to + before_last, to + columns, photo_row[last]);

@@ -33,6 +33,9 @@ public:
     // n columns from a 16.16 position on. REQUIRES: 0 <= n <= TILE + 2; rises(first, step_size, n).
     photo_columns(int32_t first, int32_t step_size, int n, int photo_width);
 
+    // The photo's last column; 0 for a photo without columns.
+    int last_of_photo() const { return last_column; }
+
     // The photo column of view column i, not clamped to the photo.
     int operator[](int i) const { return columns[i]; }
 

@@ -76,8 +76,8 @@ public:
           shown(d.columns.at(left), d.columns.step, count, d.photo.width),
           looked_at(wrap_sub(d.columns.at(left), d.columns.step), d.columns.step, count + 2,
                     d.photo.width),
-          first(std::max(looked_at.first_from(1), holds_left ? 2 : 1)),
-          end(std::min(looked_at.first_from(d.photo.width - 1), holds_right ? count : count + 1)) {}
+          first(std::max(looked_at.first_from(1), 1)),
+          end(std::min(looked_at.first_from(looked_at.last_of_photo()), count + 1)) {}
 
     // Draws all rows. The photo is drawn one row ahead of the dashes, since a row without dashes
     // can be copied to the next.
@@ -85,8 +85,8 @@ public:
         class_row read[3];  // above, current and below, in turns
         int next = 1;
         show_row(d.area.top, d.photo_row(d.area.top), &read[0]);
-        const class_row* above = &read[0];
         const class_row* current = &read[0];
+        const class_row* above = current;
         for (int y = d.area.top; y < d.area.bottom; ++y) {
             const class_row* below = current;
             const int photo_y = d.photo_row(y + 1);

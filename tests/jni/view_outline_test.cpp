@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include "jni/photo_columns.h"
 #include "jni/view_image.h"
 #include "tests/helpers/guarded_buffer.h"
 #include "tests/helpers/picture.h"
@@ -398,13 +399,39 @@ TEST(draw_image_with_outline, ANeighbourOutsideTheMaskMakesNoOutline) {
     std::fill_n(zeros.begin() + 150000, 16, 1);
     const Pixels photo(4, 4, 'a');
     const outlined_photo outlined = {{photo.ints(), 4, 4}, zeros.data() + 150000};
-    for (const float scale : {2.0f, 3.0f, 1000.0f, 20000.0f}) {
+    for (const float scale : {2.0f, 3.0f, 6.0f, 1000.0f, 20000.0f}) {
         for (const int o : {1, 2}) {
             const int before = o - static_cast<int>(scale);
             Pixels view("... ... ...");
             draw_image_with_outline({view.ints(), 3}, outlined, scale, before, before, DASHES,
                                     {0, 2, 0, 2});
             EXPECT_EQ(view, Pixels("111 1a1 111")) << "scale " << scale << ", pixel " << o;
+        }
+    }
+}
+
+TEST(draw_image_with_outline, GoesOnWhereTilesOfTheViewMeet) {
+    constexpr int WIDE = 2 * TILE + 100;
+    Picture line(WIDE, 3, 0);
+    std::fill_n(line.cells.begin() + WIDE, WIDE, 1);
+    const Pixels view = drawn(Pixels(WIDE, 3, 'a'), line);
+    for (int x = 0; x < WIDE; ++x) {
+        const auto i = static_cast<size_t>(x);
+        ASSERT_EQ(view.cells[i], Pixels::pixel_of('a')) << x;
+        ASSERT_EQ(view.cells[WIDE + i], static_cast<uint32_t>(DASHES.at(x, 1))) << x;
+        ASSERT_EQ(view.cells[2 * WIDE + i], Pixels::pixel_of('a')) << x;
+    }
+
+    for (int hole = TILE - 3; hole < TILE + 3; ++hole) {
+        Picture mask(WIDE, 5, 1);
+        mask.at(hole, 2) = 0;
+        const Pixels beside = drawn(Pixels(WIDE, 5, 'a'), mask);
+        for (int x = TILE - 5; x < TILE + 5; ++x) {
+            const auto expected = x == hole - 1 || x == hole + 1
+                                      ? static_cast<uint32_t>(DASHES.at(x, 2))
+                                      : Pixels::pixel_of('a');
+            ASSERT_EQ(beside.cells[static_cast<size_t>(2 * WIDE + x)], expected)
+                << x << " beside a hole at " << hole;
         }
     }
 }
@@ -509,6 +536,17 @@ TEST(draw_small_image_with_outline, AWholeSelectionHasDashesOnThePhotosBorder) {
         1aaaaa2
         1aaaaa2
         2222211)"));
+}
+
+TEST(draw_small_image_with_outline, GoesOnWhereTilesOfTheViewMeet) {
+    constexpr int WIDE = 2 * TILE + 100;
+    Picture line(WIDE, 3, 0);
+    std::fill_n(line.cells.begin() + WIDE, WIDE, 1);
+    const Pixels view = drawn_small(Pixels(WIDE, 3, 'a'), line);
+    for (int x = 0; x < WIDE; ++x) {
+        ASSERT_EQ(view.cells[static_cast<size_t>(WIDE + x)], static_cast<uint32_t>(DASHES.at(x, 1)))
+            << x;
+    }
 }
 
 TEST(draw_small_image_with_outline, TheRectanglesEdgesAreNoOutline) {
