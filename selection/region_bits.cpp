@@ -4,6 +4,7 @@
 #include <cstring>
 
 #include "selection/contour_tracer.h"
+#include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 
 namespace {
@@ -43,8 +44,8 @@ region_bits::region_bits(unsigned char* cells, int mask_width, int height, const
       box(clip_to_image(inside, mask_width, height)),
       column_count(length(box.left, box.right)),
       row_count(column_count == 0 ? 0 : length(box.top, box.bottom)),
-      shared_first(1 - box.left),
-      shared_last(mask_width - box.left) {
+      shared_first(wrap_sub(1, box.left)),  // an empty box may lie anywhere
+      shared_last(wrap_sub(mask_width, box.left)) {
     constexpr int MOST = INT32_MAX - 2 * WORD_BITS;
     if (marker_bytes(width, height) == 0 || column_count > MOST || row_count > MOST) return;
 
