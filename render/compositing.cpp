@@ -20,9 +20,13 @@ void ze_draw_withmask(uint32_t* src, uint32_t* dst, unsigned char* mask, int wid
                       int right, int top, int bottom) {
     if (left > right) return;
     const row_kernels& kernels = row_kernels_of_this_cpu();
-    for (int64_t y = top; y <= bottom; ++y) {
+    const int64_t columns = int64_t{right} - left + 1, rows = int64_t{bottom} - top + 1;
+    // Rows of the image's width go on where the row above ends.
+    const int64_t joined = columns == width ? std::max<int64_t>(rows, 1) : 1;
+    for (int64_t y = top; y <= bottom; y += joined) {
         const int64_t i = y * width + left;
-        kernels.colour_selection(src + i, mask + i, dst + i, ptrdiff_t{right} - left + 1);
+        kernels.colour_selection(src + i, mask + i, dst + i,
+                                 static_cast<ptrdiff_t>(columns * joined));
     }
 }
 

@@ -5,18 +5,14 @@
 
 namespace scalar {
 
-static constexpr row_loops::grey_factors FACTORS = {row_loops::THIRD, row_loops::SPREAD};
-
-void grey(const uint32_t* src, uint32_t* dst, ptrdiff_t n) {
-    row_loops::grey(src, dst, n, FACTORS);
-}
+void grey(const uint32_t* src, uint32_t* dst, ptrdiff_t n) { row_loops::grey(src, dst, n); }
 
 void colour_selection(const uint32_t* src, const uint8_t* mask, uint32_t* dst, ptrdiff_t n) {
-    row_loops::colour_selection(src, mask, dst, n, FACTORS);
+    row_loops::colour_selection(src, mask, dst, n);
 }
 
 void invert_and_colour(const uint32_t* src, uint8_t* mask, uint32_t* dst, ptrdiff_t n) {
-    row_loops::invert_and_colour(src, mask, dst, n, FACTORS);
+    row_loops::invert_and_colour(src, mask, dst, n);
 }
 
 void invert(uint8_t* mask, ptrdiff_t n) { row_loops::invert(mask, n); }

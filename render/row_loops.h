@@ -22,36 +22,27 @@
 
 namespace row_loops {
 
-// What greying multiplies by.
-struct grey_factors {
-    uint32_t third;   // of 65536, rounded up: sum * third >> 16 is sum / 3 up to 765
-    uint32_t spread;  // copies a byte into all three channels
-};
-
-constexpr uint32_t THIRD = 0x5556;
-constexpr uint32_t SPREAD = 0x010101;
-
-ROW_LOOP uint32_t grey_of(uint32_t pixel, grey_factors by) {
+ROW_LOOP uint32_t grey_of(uint32_t pixel) {
     const uint32_t sum = (pixel >> 16 & 0xFF) + (pixel >> 8 & 0xFF) + (pixel & 0xFF);
-    return (pixel & 0xFF000000u) | (sum * by.third >> 16) * by.spread;
+    const uint32_t third = sum * 0x5556 >> 16;  // sum / 3 up to 765
+    return (pixel & 0xFF000000u) | third * 0x010101;
 }
 
-ROW_LOOP void grey(const uint32_t* src, uint32_t* dst, ptrdiff_t n, grey_factors by) {
-    FOR_INDEPENDENT_STEPS(ptrdiff_t i = 0; i < n; ++i) dst[i] = grey_of(src[i], by);
+ROW_LOOP void grey(const uint32_t* src, uint32_t* dst, ptrdiff_t n) {
+    FOR_INDEPENDENT_STEPS(ptrdiff_t i = 0; i < n; ++i) dst[i] = grey_of(src[i]);
 }
 
-ROW_LOOP void colour_selection(const uint32_t* src, const uint8_t* mask, uint32_t* dst, ptrdiff_t n,
-                               grey_factors by) {
+ROW_LOOP void colour_selection(const uint32_t* src, const uint8_t* mask, uint32_t* dst,
+                               ptrdiff_t n) {
     FOR_INDEPENDENT_STEPS(ptrdiff_t i = 0; i < n; ++i) {
-        const uint32_t grey = grey_of(src[i], by);
+        const uint32_t grey = grey_of(src[i]);
         dst[i] = mask[i] == 1 ? src[i] : grey;
     }
 }
 
-ROW_LOOP void invert_and_colour(const uint32_t* src, uint8_t* mask, uint32_t* dst, ptrdiff_t n,
-                                grey_factors by) {
+ROW_LOOP void invert_and_colour(const uint32_t* src, uint8_t* mask, uint32_t* dst, ptrdiff_t n) {
     FOR_INDEPENDENT_STEPS(ptrdiff_t i = 0; i < n; ++i) {
-        const uint32_t grey = grey_of(src[i], by);
+        const uint32_t grey = grey_of(src[i]);
         dst[i] = mask[i] == 1 ? grey : src[i];
         mask[i] = mask[i] != 1;
     }

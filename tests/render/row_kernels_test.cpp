@@ -182,6 +182,52 @@ TEST_P(row_kernel, InvertsAMask) {
     });
 }
 
+namespace {
+
+// The values of a larger array: some others, again and again.
+template <class T>
+std::vector<T> repeated(const std::vector<T>& values, size_t n) {
+    std::vector<T> all(n);
+    for (size_t i = 0; i < n; ++i) all[i] = values[i % values.size()];
+    return all;
+}
+
+}  // namespace
+
+// A variant may treat images of millions of pixels in a way of its own.
+TEST_P(row_kernel, ComposesLargeImagesAsSmallOnes) {
+    constexpr size_t MEGAPIXEL = 1 << 20;
+    random_source random(1);
+    const pixels few_pixels = random_pixels(random, 5003);
+    const bytes few_bytes = random_bytes(random, 4099);
+    for (const size_t n : {MEGAPIXEL, MEGAPIXEL + 15, MEGAPIXEL + 4095, MEGAPIXEL + 4113}) {
+        SCOPED_TRACE("length " + std::to_string(n));
+        const pixels src = repeated(few_pixels, n);
+        const bytes mask = repeated(few_bytes, n);
+        pixels grey, coloured, inverted_coloured;
+        bytes inverted;
+        for (size_t i = 0; i < n; ++i) {
+            const bool selected = mask[i] == 1;
+            grey.push_back(grey_of(src[i]));
+            coloured.push_back(selected ? src[i] : grey[i]);
+            inverted_coloured.push_back(selected ? grey[i] : src[i]);
+            inverted.push_back(!selected);
+        }
+        const auto count = static_cast<ptrdiff_t>(n);
+        guarded_buffer<uint32_t> from(src, guard::BEHIND), to(pixels(n, 7), guard::BEHIND);
+        guarded_buffer<uint8_t> selection(mask, guard::BEHIND);
+        kernels.grey(from.data(), to.data(), count);
+        EXPECT_TRUE(to.values() == grey);
+        kernels.colour_selection(from.data(), selection.data(), to.data(), count);
+        EXPECT_TRUE(to.values() == coloured);
+        EXPECT_TRUE(selection.values() == mask) << "the mask changed";
+        EXPECT_TRUE(from.values() == src) << "the source changed";
+        kernels.invert_and_colour(from.data(), selection.data(), from.data(), count);
+        EXPECT_TRUE(from.values() == inverted_coloured) << "in place";
+        EXPECT_TRUE(selection.values() == inverted);
+    }
+}
+
 TEST_P(row_kernel, GathersPixelsAndBytes) {
     at_every_length([&](random_source& random, int n, guard side) {
         const int columns = random.between(1, 50);
