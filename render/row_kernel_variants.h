@@ -17,6 +17,7 @@ void classify(const uint8_t* mask, uint8_t* classes, ptrdiff_t n);
 bool outline(const uint8_t* current, const rows_around& around, uint8_t* flags, ptrdiff_t n);
 bool small_outline(const uint8_t* current, const rows_around& around, uint8_t* flags, ptrdiff_t n);
 ptrdiff_t last_selected(const uint8_t* mask, ptrdiff_t n);
+ptrdiff_t pack_bits(const uint8_t* mask, uint64_t* words, ptrdiff_t count);
 
 }  // namespace scalar
 

@@ -45,12 +45,17 @@ ptrdiff_t last_selected(const uint8_t* mask, ptrdiff_t n) {
     return row_loops::last_selected(mask, n);
 }
 
+ptrdiff_t pack_bits(const uint8_t* mask, uint64_t* words, ptrdiff_t count) {
+    return row_loops::pack_bits(mask, words, count);
+}
+
 }  // namespace scalar
 
 const row_kernels scalar_row_kernels = {
-    "scalar",         scalar::grey,          scalar::colour_selection, scalar::invert_and_colour,
-    scalar::invert,   scalar::gather_pixels, scalar::gather_bytes,     scalar::double_pixels,
-    scalar::classify, scalar::outline,       scalar::small_outline,    scalar::last_selected,
+    "scalar",          scalar::grey,          scalar::colour_selection, scalar::invert_and_colour,
+    scalar::invert,    scalar::gather_pixels, scalar::gather_bytes,     scalar::double_pixels,
+    scalar::classify,  scalar::outline,       scalar::small_outline,    scalar::last_selected,
+    scalar::pack_bits,
 };
 
 const row_kernels* const row_kernel_variants[] = {

@@ -58,6 +58,10 @@ struct row_kernels {
 
     // Index of the last 1, or -1.
     ptrdiff_t (*last_selected)(const uint8_t* mask, ptrdiff_t n);
+
+    // Makes a word of every 64 values, which must be 0 or 1: bit k is value k. Stops at other
+    // values; returns the number of words made, of `count`.
+    ptrdiff_t (*pack_bits)(const uint8_t* mask, uint64_t* words, ptrdiff_t count);
 };
 
 // The definition first. A processor runs all up to row_kernels_of_this_cpu().

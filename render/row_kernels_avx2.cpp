@@ -38,9 +38,8 @@ AVX2 __m256i grey_of(__m256i pixels) {
     const __m256i pairs = _mm256_maddubs_epi16(pixels, not_alpha);  // B + G, R
     const __m256i sum = _mm256_madd_epi16(pairs, _mm256_set1_epi16(1));
     const __m256i third = _mm256_mulhi_epu16(sum, _mm256_set1_epi16(0x5556));  // up to 765
-    const __m256i into_channels = _mm256_setr_epi8(                            //
-        0, 0, 0, -1, 4, 4, 4, -1, 8, 8, 8, -1, 12, 12, 12, -1,                 //
-        0, 0, 0, -1, 4, 4, 4, -1, 8, 8, 8, -1, 12, 12, 12, -1);
+    const __m256i into_channels = _mm256_broadcastsi128_si256(
+        _mm_setr_epi8(0, 0, 0, -1, 4, 4, 4, -1, 8, 8, 8, -1, 12, 12, 12, -1));
     const __m256i alpha = _mm256_and_si256(pixels, _mm256_set1_epi32(~0xFFFFFF));
     return _mm256_or_si256(alpha, _mm256_shuffle_epi8(third, into_channels));
 }
@@ -181,10 +180,27 @@ AVX2 ptrdiff_t last_selected(const uint8_t* mask, ptrdiff_t n) {
     return row_loops::last_selected(mask, n);
 }
 
+// The lowest bits of 32 bytes.
+AVX2 uint64_t lowest_bits(__m256i bytes) {
+    return static_cast<uint32_t>(_mm256_movemask_epi8(_mm256_slli_epi16(bytes, 7)));
+}
+
+AVX2 ptrdiff_t pack_bits(const uint8_t* mask, uint64_t* words, ptrdiff_t count) {
+    const __m256i other_bits = _mm256_set1_epi8(~1);
+    for (ptrdiff_t word = 0; word < count; ++word) {
+        const auto* const values = reinterpret_cast<const __m256i*>(mask + 64 * word);
+        const __m256i low = _mm256_loadu_si256(values), high = _mm256_loadu_si256(values + 1);
+        if (!_mm256_testz_si256(_mm256_or_si256(low, high), other_bits)) return word;
+        words[word] = lowest_bits(high) << 32 | lowest_bits(low);
+    }
+    return count;
+}
+
 }  // namespace
 
 const row_kernels avx2_row_kernels = {"avx2",   grey,          colour_selection, invert_and_colour,
                                       invert,   gather_pixels, gather_bytes,     double_pixels,
-                                      classify, outline,       small_outline,    last_selected};
+                                      classify, outline,       small_outline,    last_selected,
+                                      pack_bits};
 
 #endif

@@ -79,6 +79,7 @@ const row_kernels neon_row_kernels = {
     scalar::outline,
     scalar::small_outline,
     scalar::last_selected,
+    scalar::pack_bits,
 };
 
 #endif

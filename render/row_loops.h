@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 
 #include "render/row_kernels.h"
 
@@ -119,6 +120,41 @@ ROW_LOOP ptrdiff_t last_selected(const uint8_t* mask, ptrdiff_t n) {
         --n;
     } while (n >= 0 && mask[n] != 1);
     return n;
+}
+
+constexpr uint64_t EIGHT_ONES = 0x0101010101010101;
+constexpr ptrdiff_t WORD_BITS = 64;
+
+// Eight bytes, the first lowest on every CPU.
+ROW_LOOP uint64_t load_bytes(const uint8_t* bytes) {
+    uint64_t loaded;
+    std::memcpy(&loaded, bytes, sizeof loaded);
+#if __BYTE_ORDER__ == __ORDER_BIG_ENDIAN__
+    loaded = __builtin_bswap64(loaded);
+#endif
+    return loaded;
+}
+
+ROW_LOOP ptrdiff_t pack_bits(const uint8_t* mask, uint64_t* words, ptrdiff_t count) {
+    for (ptrdiff_t word = 0; word < count; ++word, mask += WORD_BITS) {
+        uint64_t some = 0, every = EIGHT_ONES, bits = 0;
+        for (ptrdiff_t i = 0; i < WORD_BITS; i += 8) {
+            some |= load_bytes(mask + i);
+            every &= load_bytes(mask + i);
+        }
+        if ((some & ~EIGHT_ONES) != 0) return word;
+        // Most words are of one value.
+        if (every == EIGHT_ONES) {
+            bits = ~uint64_t{0};
+        } else if (some != 0) {
+            // Each product moves bit 8 k to bit 56 + k, for each k; no two bits meet.
+            for (ptrdiff_t i = 0; i < WORD_BITS; i += 8) {
+                bits |= load_bytes(mask + i) * 0x0102040810204080u >> 56 << i;
+            }
+        }
+        words[word] = bits;
+    }
+    return count;
 }
 
 }  // namespace row_loops

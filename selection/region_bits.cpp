@@ -3,29 +3,12 @@
 #include <algorithm>
 #include <cstring>
 
+#include "render/row_kernels.h"
 #include "selection/contour_tracer.h"
 #include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 
 namespace {
-
-constexpr bit_word EIGHT_ONES = 0x0101010101010101;
-
-// Eight bytes of 0 or 1 as bits 0 to 7, the first byte lowest.
-bit_word pack(bit_word bytes) {
-    // Moves bit 8 k to bit 56 + k, for each k; no two products meet.
-    return bytes * 0x0102040810204080u >> 56;
-}
-
-// Eight bytes, the first lowest on every CPU.
-bit_word load_bytes(const unsigned char* bytes) {
-    bit_word loaded;
-    std::memcpy(&loaded, bytes, sizeof loaded);
-#if __BYTE_ORDER__ == __ORDER_BIG_ENDIAN__
-    loaded = __builtin_bswap64(loaded);
-#endif
-    return loaded;
-}
 
 int words_for(int bits) { return (bits + WORD_BITS - 1) / WORD_BITS; }
 
@@ -75,57 +58,64 @@ region_bits::region_bits(unsigned char* cells, int mask_width, int height, const
 region_bits::~region_bits() { ze_free(members); }
 
 void region_bits::read_mask(const region_values& values) {
+    constexpr int TOGETHER = 64;
+    bit_word packed[TOGETHER];
+    const row_kernels& kernels = row_kernels_of_this_cpu();
     for (int row = 1; row <= row_count; ++row) {
-        unsigned char* const pixels = pixel({1, row});
         // Column 0 has no pixel, so the first word holds one fewer.
-        for (int word = 0, read = 0; read < column_count; ++word) {
-            const int skipped = word == 0 ? 1 : 0;
-            const int count = std::min(WORD_BITS - skipped, column_count - read);
-            bit_word visited_bits = 0;
-            const bit_word bits = read_word(pixels + read, count, values, &visited_bits);
-            // Memory that stays 0 is not even touched.
-            if (bits != 0) {
-                member({row, word}) = bits << skipped;
-                occupied.insert({row, word});
-                unfinished.insert({row, word});
-            }
-            if (visited_bits != 0) visited({row, word}) = visited_bits << skipped;
-            read += count;
+        read_word({row, 0}, 1, std::min(WORD_BITS - 1, column_count), values);
+        for (word_place at = {row, 1}; at.word * WORD_BITS <= column_count;) {
+            const int column = at.word * WORD_BITS;
+            const int whole_words = (column_count - column + 1) / WORD_BITS;
+            const auto read = static_cast<int>(
+                kernels.pack_bits(pixel({column, row}), packed, std::min(whole_words, TOGETHER)));
+            for (int i = 0; i < read; ++i, ++at.word) set_ones(at, packed[i], values);
+            if (read > 0) continue;
+            read_word(at, column, std::min(WORD_BITS, column_count - column + 1), values);
+            ++at.word;
         }
     }
 }
 
-bit_word region_bits::read_word(unsigned char* pixels, int count, const region_values& values,
-                                bit_word* is_visited) {
-    unsigned char copy[WORD_BITS] = {};
-    const unsigned char* from = pixels;
-    if (count < WORD_BITS) {
-        std::memcpy(copy, pixels, static_cast<size_t>(count));
-        from = copy;
-    }
-    // Nearly all words hold only 0 or only 1, and nearly all others both; none of these has visited
-    // pixels or some to replace.
-    bit_word some = 0;
-    for (int i = 0; i < WORD_BITS; i += 8) some |= load_bytes(from + i);
-    if (some == 0) return 0;
-    if ((some & ~EIGHT_ONES) == 0) {
-        if (!values.member.has(1)) return 0;
-        bit_word every = some;
-        for (int i = 0; i < WORD_BITS; i += 8) every &= load_bytes(from + i);
-        if (every == EIGHT_ONES) return ~bit_word{0};
-        bit_word ones = 0;
-        for (int i = 0; i < WORD_BITS; i += 8) ones |= pack(load_bytes(from + i)) << i;
-        return ones;
-    }
+void region_bits::set_ones(word_place at, bit_word ones, const region_values& values) {
+    if (values.member.has(1)) set_members(at, ones);
+}
 
-    bit_word members_here = 0;
-    for (int i = 0; i < count; ++i) {
-        const unsigned char value = pixels[i];
-        if (values.member.has(value)) members_here |= bit_word{1} << i;
-        if (value == VISITED_VALUE) *is_visited |= bit_word{1} << i;
-        if (values.replaced.has(value)) pixels[i] = values.replacement;
+void region_bits::set_members(word_place at, bit_word bits) {
+    if (bits == 0) return;  // memory that stays 0 is not even touched
+    member(at) = bits;
+    occupied.insert(at);
+    unfinished.insert(at);
+}
+
+void region_bits::read_word(word_place at, int column, int count, const region_values& values) {
+    unsigned char* const pixels = pixel({column, at.row});
+    const int skipped = place_in_word(column);
+    unsigned char copy[WORD_BITS] = {};
+    std::memcpy(copy + skipped, pixels, static_cast<size_t>(count));
+    bit_word ones;
+    if (row_kernels_of_this_cpu().pack_bits(copy, &ones, 1) == 1) {
+        set_ones(at, ones, values);
+        return;
     }
-    return members_here;
+    // Eights of bytes that are in no set are passed over.
+    uint64_t eight;
+    constexpr int EIGHT = sizeof eight;
+    const uint64_t in_no_set = values.member.has(1) ? 0 : 0x0101010101010101;
+    bit_word members_here = 0, visited_here = 0;
+    for (int first = 0; first < WORD_BITS; first += EIGHT) {
+        std::memcpy(&eight, copy + first, sizeof eight);
+        if ((eight & ~in_no_set) == 0) continue;
+        for (int i = first; i < first + EIGHT; ++i) {
+            const unsigned char value = copy[i];
+            const bit_word bit = bit_word{1} << i;
+            if (values.member.has(value)) members_here |= bit;
+            if (value == VISITED_VALUE) visited_here |= bit;
+            if (values.replaced.has(value)) pixels[i - skipped] = values.replacement;
+        }
+    }
+    set_members(at, members_here);
+    if (visited_here != 0) visited(at) = visited_here;
 }
 
 void region_bits::clear_markers() {

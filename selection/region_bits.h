@@ -118,6 +118,22 @@ public:
         return previous_bit(sets + ptrdiff_t{at.row} * row_words, at.word);
     }
 
+    // Calls visit(word_place) for each word of the set from `at` to before `end` in its row. Visits
+    // may change the set ahead of them.
+    template <class Visit>
+    void for_each(word_place at, int end, Visit visit) const {
+        if (at.word >= end) return;
+        for (int i = word_with(at.word); i <= word_with(end - 1); ++i) {
+            const bit_word& set = sets[ptrdiff_t{at.row} * row_words + i];
+            bit_word ahead = bits_between(at.word, end - 1, i);
+            while (const bit_word left = set & ahead) {
+                const int place = lowest_bit(left);
+                visit(word_place{at.row, i * WORD_BITS + place});
+                ahead &= ~bit_word{1} << place;
+            }
+        }
+    }
+
 private:
     static bit_word bit_of(word_place at) { return bit_word{1} << place_in_word(at.word); }
     bit_word& set_of(word_place at) const {
@@ -136,7 +152,7 @@ private:
     int row_words = 0;
 };
 
-// Which values of the mask mean what to a pass.
+// Which values of the mask mean what to a pass. 0 is in no set.
 struct region_values {
     value_set member;           // belong to regions
     value_set replaced;         // do not stay: the mask holds ...
@@ -207,16 +223,12 @@ public:
     }
     void set_unvisited(cell c) { visited(word_of(c)) &= ~bit_of(c); }
 
-    // Calls visit(word_place), row by row, for each word of the cells in `area` that is in `words`.
+    // Calls visit(word_place), row by row, for each word of the cells in `area` that is in `words`
+    // when its turn comes.
     template <class Visit>
     static void for_each_word(const word_set& words, const ze_rect& area, Visit visit) {
-        const int end = word_with(area.right) + 1;
         for (int row = area.top; row <= area.bottom; ++row) {
-            for (word_place at = {row, word_with(area.left)};; ++at.word) {
-                at.word = words.next(at, end);
-                if (at.word == end) break;
-                visit(at);
-            }
+            words.for_each({row, word_with(area.left)}, word_with(area.right) + 1, visit);
         }
     }
 
@@ -241,7 +253,7 @@ public:
     // Notes a change of a visited cell, or of a marker beside a cell, in a word.
     void touch(word_place at) {
         dirty.insert(at);
-        look_again_at(at.row, at.row);
+        dirty_rows[word_with(at.row)] |= row_bit(at.row);
     }
 
     // The first dirty word of the cells in `area` at or behind `at`: in its row, or else in a later
@@ -257,7 +269,7 @@ public:
             if (at.word < end) return at;
             at = {next_bit(dirty_rows, at.row + 1, area.bottom + 1), first};
             if (at.row > area.bottom) return at;
-            dirty_rows[word_with(at.row)] &= ~(bit_word{1} << place_in_word(at.row));
+            dirty_rows[word_with(at.row)] &= ~row_bit(at.row);
         }
     }
 
@@ -290,6 +302,13 @@ public:
         const int x = box.left - 1 + at.word * WORD_BITS;
         const int y = box.top - 1 + at.row;
         unite(r, {x + lowest_bit(bits), x + highest_bit(bits), y, y});
+    }
+
+    // Whether include_bits(&r, at, bits) would leave r as it is.
+    bool includes_bits(const ze_rect& r, word_place at, bit_word bits) const {
+        ze_rect widened = r;
+        include_bits(&widened, at, bits);
+        return widened == r;
     }
 
     // Widens r over the cells of all bits_of(word_place), of which only occupied words have some.
@@ -378,10 +397,12 @@ private:
         touch(beside);
     }
 
+    static bit_word row_bit(int row) { return bit_word{1} << place_in_word(row); }
     ptrdiff_t offset(word_place at) const { return ptrdiff_t{at.row} * row_words + at.word; }
     void read_mask(const region_values& values);
-    bit_word read_word(unsigned char* pixels, int count, const region_values& values,
-                       bit_word* is_visited);
+    void read_word(word_place at, int column, int count, const region_values& values);
+    void set_ones(word_place at, bit_word ones, const region_values& values);
+    void set_members(word_place at, bit_word bits);
 
     unsigned char* const mask;
     const int width;    // of the image

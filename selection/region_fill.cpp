@@ -36,7 +36,9 @@ struct filling {
         bits->visited(at) |= filled;
         if (joining == 0) return filled;
         bits->member(at) |= joining;
-        if (changed) bits->include_bits(changed, at, bits->with_value(at, joining, 0));
+        if (changed && !bits->includes_bits(*changed, at, joining)) {
+            bits->include_bits(changed, at, bits->with_value(at, joining, 0));
+        }
         bits->write(at, joining, value);
         return filled;
     }
