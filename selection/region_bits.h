@@ -119,10 +119,9 @@ public:
     }
 
     // Calls visit(word_place) for each word of the set from `at` to before `end` in its row. Visits
-    // may change the set ahead of them.
+    // may change the set ahead of them. REQUIRES: at.word < end.
     template <class Visit>
     void for_each(word_place at, int end, Visit visit) const {
-        if (at.word >= end) return;
         for (int i = word_with(at.word); i <= word_with(end - 1); ++i) {
             const bit_word& set = sets[ptrdiff_t{at.row} * row_words + i];
             bit_word ahead = bits_between(at.word, end - 1, i);
