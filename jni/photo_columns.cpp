@@ -1,6 +1,7 @@
 #include "jni/photo_columns.h"
 
 #include <algorithm>
+#include <cstring>
 
 photo_columns::photo_columns(int32_t first, int32_t step_size, int n, int photo_width)
     : kernels(row_kernels_of_this_cpu()),
@@ -49,8 +50,21 @@ void photo_columns::show_inside(const uint8_t* row, const int32_t* shown, int n,
                                 uint8_t* to) const {
     if (step == ONE_PIXEL) {
         std::copy_n(row + shown[0], n, to);
-    } else {
-        kernels.gather_bytes(row, shown, to, n);
+        return;
+    }
+    // A row of a mask is mostly long stretches of one value. To find that nothing is to be gathered
+    // is cheaper than gathering, unless columns lie far apart.
+    constexpr int STRETCH = 128;
+    for (int i = 0; i < n; i += STRETCH) {
+        const int shown_here = std::min(STRETCH, n - i);
+        const uint8_t* const first = row + shown[i];
+        const int others = shown[i + shown_here - 1] - shown[i];
+        if (others <= 4 * STRETCH &&
+            std::memcmp(first, first + 1, static_cast<size_t>(others)) == 0) {
+            std::fill_n(to + i, shown_here, *first);
+        } else {
+            kernels.gather_bytes(row, shown + i, to + i, shown_here);
+        }
     }
 }
 
