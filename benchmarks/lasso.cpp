@@ -8,6 +8,7 @@
 #include "benchmarks/job.h"
 #include "benchmarks/lasso_peers.h"
 #include "selection/ER_selection.h"
+#include "selection/rectangles.h"
 #include "selection/region_plain.h"
 #include "selection/region_shaping.h"
 

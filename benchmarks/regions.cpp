@@ -7,6 +7,7 @@
 #include "benchmarks/inputs.h"
 #include "benchmarks/job.h"
 #include "benchmarks/regions_peers.h"
+#include "selection/rectangles.h"
 #include "selection/region_plain.h"
 #include "selection/region_shaping.h"
 

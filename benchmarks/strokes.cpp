@@ -9,6 +9,7 @@
 #include "benchmarks/strokes_peers.h"
 #include "selection/ER_selection.h"
 #include "selection/competition_plain.h"
+#include "selection/rectangles.h"
 
 namespace {
 

@@ -7,11 +7,11 @@
 // channels. Pointers, lengths and rectangles are not checked.
 #pragma once
 
-#include <cstdint>
+#include <stdint.h>
 
 #include "support/ze_api.h"
 
-extern "C" {
+ZE_BEGIN_FLAT
 
 // Greys width * height pixels of src into dst.
 //
@@ -47,4 +47,4 @@ ZE_API void ze_draw_reverse_mask_v2(uint32_t* src, uint32_t* dst, unsigned char*
                                     int width, int height, int mask_width, int mask_height,
                                     float ratio);
 
-}  // extern "C"
+ZE_END_FLAT

@@ -1,11 +1,11 @@
 // Carries a selection made on a reduced copy of a photo over to the photo itself.
 #pragma once
 
-#include <cstdint>
+#include <stdint.h>
 
 #include "support/ze_api.h"
 
-extern "C" {
+ZE_BEGIN_FLAT
 
 // Transfers a rectangle of the small mask onto the large one. Each small pixel covers a block of
 // large ones. A block whose small pixel equals its right, lower and diagonal neighbour takes that
@@ -33,4 +33,4 @@ ZE_API void ze_modify_mask(unsigned char* small_mask, unsigned char* large_mask,
                            int large_width, int, float ratio, int left, int right, int top,
                            int bottom, int flag);
 
-}  // extern "C"
+ZE_END_FLAT

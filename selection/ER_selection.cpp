@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <new>
 
+#include "selection/brush_cells.h"
 #include "selection/colour_cost.h"
 #include "selection/competition_memory.h"
 #include "support/ze_alloc.h"

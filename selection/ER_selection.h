@@ -8,8 +8,6 @@
 // What does outlive a stroke: the cost arrays, and whatever a broken list left in the queue.
 #pragma once
 
-#include <cstddef>
-
 #include "selection/D_Queue.h"
 #include "selection/ze_rect.h"
 #include "support/ze_api.h"
@@ -115,16 +113,3 @@ public:
     int nodes_used;   // records of node_pool taken by the current stroke
     D_Queue* queue;   // owned
 };
-
-// Every buffer that initial() takes is there.
-bool has_buffers(const ER_selection& engine);
-
-// Side of the brush square in cells; 0 for a negative radius.
-inline ptrdiff_t brush_side(const ER_selection& engine) {
-    return engine.radius < 0 ? 0 : 2 * static_cast<ptrdiff_t>(engine.radius) + 1;
-}
-
-// The cell of `engine`'s brush at (dx, dy) from its centre.
-inline ptrdiff_t brush_cell(const ER_selection& engine, ptrdiff_t dx, ptrdiff_t dy) {
-    return (dy + engine.radius) * brush_side(engine) + dx + engine.radius;
-}

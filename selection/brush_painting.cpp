@@ -4,6 +4,8 @@
 #include <cstdint>
 
 #include "selection/ER_selection.h"
+#include "selection/brush_cells.h"
+#include "selection/rectangles.h"
 
 namespace {
 

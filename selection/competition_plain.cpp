@@ -2,7 +2,9 @@
 
 #include <cstdint>
 
+#include "selection/brush_cells.h"
 #include "selection/competition_rules.h"
+#include "selection/rectangles.h"
 #include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 
+#include "selection/rectangles.h"
 #include "support/ze_alloc.h"
 
 namespace {

@@ -14,11 +14,13 @@
 #include <algorithm>
 #include <cstdint>
 
+#include "selection/brush_cells.h"
 #include "selection/colour_cost.h"
 #include "selection/competition_memory.h"
 #include "selection/competition_plain.h"
 #include "selection/competition_rules.h"
 #include "selection/front_queue.h"
+#include "selection/rectangles.h"
 #include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 

@@ -6,6 +6,7 @@
 
 #include "selection/ER_selection.h"
 #include "selection/lasso_values.h"
+#include "selection/rectangles.h"
 #include "support/arithmetic.h"
 #include "support/fixed_point.h"
 

@@ -6,6 +6,7 @@
 #include <new>
 
 #include "render/row_kernels.h"
+#include "selection/rectangles.h"
 #include "selection/region_shaping.h"
 #include "support/log.h"
 #include "support/ze_alloc.h"

@@ -10,11 +10,16 @@
 // Pointers and buffer lengths are never checked, sizes and coordinates only where it says so.
 #pragma once
 
-#include "selection/ER_selection.h"
 #include "selection/ze_rect.h"
 #include "support/ze_api.h"
 
-extern "C" {
+#ifdef __cplusplus
+#include "selection/ER_selection.h"
+#else
+typedef struct ER_selection ER_selection;  // a class of C++; C can hand it on and compare with null
+#endif
+
+ZE_BEGIN_FLAT
 
 // The engine, or null before the first init or brush change and after ze_destroy_objectsel.
 ZE_API extern ER_selection* g_ERBrush;
@@ -35,7 +40,7 @@ ZE_API extern int g_Brush_Center;  // radius of the core in pixels, 1 at first
 ZE_API int ze_init_objectsel(int width, int height);
 
 // Releases the engine. Brush globals and rectangles stay.
-ZE_API void ze_destroy_objectsel();
+ZE_API void ze_destroy_objectsel(void);
 
 // Clears width * height bytes of the mask and empties the object box. Bad input (no mask, a size
 // below 1) is logged and changes nothing.
@@ -77,7 +82,7 @@ ZE_API void ze_inverse_mask(unsigned char* mask, int width, int height);
 
 // Stores the object box as it is: unordered and beyond the image too.
 ZE_API void ze_set_objectROI(ze_rect roi);
-ZE_API ze_rect ze_get_objectROI();
+ZE_API ze_rect ze_get_objectROI(void);
 
 // Shrinks the object box to the selected pixels inside it, or to {width, 0, height, 0} when there
 // are none.
@@ -89,7 +94,7 @@ ZE_API void ze_update_objectROI(unsigned char* mask, int width, int height);
 // Sets g_fill_boundary to {width - 1, 0, height - 1, 0}.
 ZE_API void ze_reset_fill_boundary(int width, int height);
 
-ZE_API int ze_get_brush_radius();
-ZE_API int ze_get_brush_center();
+ZE_API int ze_get_brush_radius(void);
+ZE_API int ze_get_brush_center(void);
 
-}  // extern "C"
+ZE_END_FLAT

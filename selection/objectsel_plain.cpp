@@ -3,6 +3,7 @@
 #include <cstddef>
 
 #include "selection/objectsel.h"
+#include "selection/rectangles.h"
 
 namespace plain {
 

@@ -5,6 +5,7 @@
 
 #include "render/row_kernels.h"
 #include "selection/contour_tracer.h"
+#include "selection/rectangles.h"
 #include "support/arithmetic.h"
 #include "support/ze_alloc.h"
 

@@ -12,8 +12,8 @@
 #include <cstddef>
 #include <cstdint>
 
+#include "selection/rectangles.h"
 #include "selection/value_set.h"
-#include "selection/ze_rect.h"
 
 using bit_word = uint64_t;
 constexpr int WORD_BITS = 64;

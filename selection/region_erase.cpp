@@ -1,6 +1,7 @@
 #include <cstdint>
 
 #include "selection/interior_pass.h"
+#include "selection/rectangles.h"
 #include "selection/region_bits.h"
 #include "selection/region_shaping.h"
 

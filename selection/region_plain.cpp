@@ -4,6 +4,7 @@
 
 #include "selection/contour_tracer.h"
 #include "selection/lasso_values.h"
+#include "selection/rectangles.h"
 
 namespace {
 

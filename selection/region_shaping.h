@@ -10,7 +10,7 @@
 #include "selection/ze_rect.h"
 #include "support/ze_api.h"
 
-extern "C" {
+ZE_BEGIN_FLAT
 
 // Fills the holes of the selection inside a box, with whatever lies in them.
 //
@@ -55,4 +55,4 @@ ZE_API int ze_lasso_add_fill_mask(unsigned char* mask, int width, int height, in
 ZE_API int ze_lasso_del_fill_mask(unsigned char* mask, int width, int height, int left, int right,
                                   int top, int bottom);
 
-}  // extern "C"
+ZE_END_FLAT

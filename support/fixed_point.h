@@ -11,11 +11,11 @@
 // library itself uses itofix and fixtoi only.
 #pragma once
 
-#include <cstdint>
+#include <stdint.h>
 
 #include "support/ze_api.h"
 
-extern "C" {
+ZE_BEGIN_FLAT
 
 ZE_API extern int32_t g_fix_errno;  // 0 at first
 
@@ -90,4 +90,4 @@ ZE_API int32_t iidiv(int32_t x, int32_t y);
 // x rounded to the nearest integer, halves away from 0; saturates.
 ZE_API int32_t round__(double x);
 
-}  // extern "C"
+ZE_END_FLAT

@@ -2,11 +2,11 @@
 // work buffers of the region passes come from ze_calloc.
 #pragma once
 
-#include <cstddef>
+#include <stddef.h>
 
 #include "support/ze_api.h"
 
-extern "C" {
+ZE_BEGIN_FLAT
 
 ZE_API void* ze_calloc(size_t count, size_t size);
 
@@ -18,4 +18,4 @@ ZE_API void ze_free(void* block);
 ZE_API void* ze_memcpy(void* target, const void* source, size_t size);
 ZE_API void* ze_realloc(void* block, size_t size);
 
-}  // extern "C"
+ZE_END_FLAT

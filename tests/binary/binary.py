@@ -18,8 +18,9 @@ SONAME = "libdraventaUtil.so"
 PAGE = 16 * 1024  # the larger of the page sizes that Android's phones have
 GROWTH = 1.1  # how many times its listed size a library may have
 
-# The Android log, the maths and the C library with the loader that belongs to it.
-MAY_NEED = re.compile(r"lib(log|m|c)\.so(\.\d+)?|ld-linux[-\w]*\.so\.\d+")
+# The Android log, the maths and the C library with the loader that belongs to it. On Android that
+# shows as libdl, which the unwinder of 32-bit ARM asks.
+MAY_NEED = re.compile(r"lib(log|m|c|dl)\.so(\.\d+)?|ld-linux[-\w]*\.so\.\d+")
 
 
 def output_of(*command):

@@ -1,4 +1,5 @@
 #include "selection/ER_selection.h"
+#include "selection/rectangles.h"
 #include "selection/region_shaping.h"
 #include "tests/differential/family.h"
 #include "tests/differential/placed_vector.h"

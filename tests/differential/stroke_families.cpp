@@ -1,6 +1,8 @@
 #include "selection/ER_selection.h"
+#include "selection/brush_cells.h"
 #include "selection/competition_plain.h"
 #include "selection/front_competition.h"
+#include "selection/rectangles.h"
 #include "tests/differential/family.h"
 #include "tests/differential/placed_vector.h"
 #include "tests/differential/random_pictures.h"

@@ -3,7 +3,7 @@
 
 #include <ostream>
 
-#include "selection/ze_rect.h"
+#include "selection/rectangles.h"
 
 inline std::ostream& operator<<(std::ostream& out, const ze_rect& r) {
     return out << '{' << r.left << ", " << r.right << ", " << r.top << ", " << r.bottom << '}';

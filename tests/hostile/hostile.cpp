@@ -19,6 +19,7 @@
 #include "render/compositing.h"
 #include "render/mask_transfer.h"
 #include "selection/objectsel.h"
+#include "selection/rectangles.h"
 #include "selection/region_shaping.h"
 #include "support/fixed_point.h"
 #include "tests/differential/random_pictures.h"

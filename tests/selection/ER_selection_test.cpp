@@ -6,6 +6,7 @@
 #include <climits>
 #include <vector>
 
+#include "selection/brush_cells.h"
 #include "selection/competition_memory.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"

@@ -4,6 +4,7 @@
 
 #include <functional>
 
+#include "selection/brush_cells.h"
 #include "selection/objectsel.h"
 #include "selection/region_shaping.h"
 #include "tests/helpers/failing_allocations.h"

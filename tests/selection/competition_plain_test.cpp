@@ -9,6 +9,7 @@
 #include <random>
 #include <vector>
 
+#include "selection/brush_cells.h"
 #include "selection/front_competition.h"
 #include "tests/helpers/picture.h"
 #include "tests/helpers/rect_printing.h"

@@ -19,6 +19,7 @@
 #include <vector>
 
 #include "selection/ER_selection.h"
+#include "selection/brush_cells.h"
 #include "selection/competition_plain.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"

@@ -7,6 +7,7 @@
 #include <climits>
 #include <vector>
 
+#include "selection/brush_cells.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/log_lines.h"
 #include "tests/helpers/picture.h"

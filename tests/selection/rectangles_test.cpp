@@ -1,4 +1,4 @@
-#include "selection/ze_rect.h"
+#include "selection/rectangles.h"
 
 #include <gtest/gtest.h>
 
