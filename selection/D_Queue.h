@@ -1,10 +1,4 @@
 // Priority queue of the selection engine.
-//
-// One doubly linked list, cheapest node first, and an index of 100 pointers into it, `step` nodes
-// apart, so that push need not walk from the head. The queue owns the index, never a node.
-//
-// The index is a hint: the engine unlinks nodes without telling it, so entries drift. push and pop
-// work with a stale entry; nothing repairs it.
 #pragma once
 
 #include <cstddef>
@@ -13,19 +7,24 @@
 
 // A pixel that a front has reached.
 struct node {
-    int x;      // pixel column in the image
-    int y;      // pixel row in the image
-    int cost;   // accumulated path cost; the priority, smaller first
-    int label;  // 1: reached from the brush core, 0: reached from the rim
-    node* prev;
-    node* next;
+    int x;       // pixel column in the image
+    int y;       // pixel row in the image
+    int cost;    // accumulated path cost; the priority, smaller first
+    int label;   // 1: reached from the brush core, 0: reached from the rim
+    node* prev;  // the node before it in the queue
+    node* next;  // the node behind it
 };
 static_assert(offsetof(node, cost) == 2 * sizeof(int) && offsetof(node, prev) == 4 * sizeof(int) &&
                   sizeof(node) == 4 * sizeof(int) + 2 * sizeof(node*),
               "callers lay the node out as x, y, cost, label, prev, next");
 
-constexpr int QUEUE_INDEX_ENTRIES = 100;
+constexpr int QUEUE_INDEX_ENTRIES = 100;  // pointers into the list
 
+// One doubly linked list, cheapest node first, and an index of 100 pointers into it, `step` nodes
+// apart, so that push need not walk from the head. The queue owns the index, never a node.
+//
+// The index is a hint: the engine unlinks nodes without telling it, so entries drift. push and pop
+// work with a stale entry; nothing repairs it.
 class ZE_API D_Queue {
 public:
     // An empty queue with `step` 100. `index` is null when it cannot be allocated.

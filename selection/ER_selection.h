@@ -1,11 +1,4 @@
 // The selection engine: a brush, working buffers of the brush's size, and the strokes.
-//
-// The brush is a square of (2 * radius + 1)^2 cells around the stroke point, each classed by its
-// rounded distance from the centre. Every per-cell array is row-major: cell (dx, dy), both within
-// -radius .. radius, is entry (dy + radius) * (2 * radius + 1) + dx + radius.
-//
-// The engine knows no image. Each stroke gets photo, mask and size, and keeps no pointer to them.
-// What does outlive a stroke: the cost arrays, and whatever a broken list left in the queue.
 #pragma once
 
 #include "selection/D_Queue.h"
@@ -24,6 +17,12 @@ enum brush_class : unsigned char {
     BRUSH_CORE = 3,     // d <= core radius: seeds of the stroke's own front
 };
 
+// The brush is a square of (2 * radius + 1)^2 cells around the stroke point, each classed by its
+// rounded distance from the centre. Every per-cell array is row-major: cell (dx, dy), both within
+// -radius .. radius, is entry (dy + radius) * (2 * radius + 1) + dx + radius.
+//
+// The engine knows no image. Each stroke gets photo, mask and size, and keeps no pointer to them.
+// What does outlive a stroke: the cost arrays, and whatever a broken list left in the queue.
 class ZE_API ER_selection {
 public:
     // An engine without buffers. Every stroke but the lasso's does nothing until initial().

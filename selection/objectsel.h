@@ -94,6 +94,7 @@ ZE_API void ze_update_objectROI(unsigned char* mask, int width, int height);
 // Sets g_fill_boundary to {width - 1, 0, height - 1, 0}.
 ZE_API void ze_reset_fill_boundary(int width, int height);
 
+// Read the brush globals.
 ZE_API int ze_get_brush_radius(void);
 ZE_API int ze_get_brush_center(void);
 

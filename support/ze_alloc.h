@@ -8,11 +8,13 @@
 
 ZE_BEGIN_FLAT
 
+// calloc(count, size)
 ZE_API void* ze_calloc(size_t count, size_t size);
 
-// Deliberate: two arguments, multiplied without an overflow check, unlike malloc.
+// malloc(count * size). Deliberate: two arguments, multiplied without an overflow check.
 ZE_API void* ze_malloc(size_t count, size_t size);
 
+// memset, free, memcpy and realloc.
 ZE_API void* ze_memset(void* target, int value, size_t size);
 ZE_API void ze_free(void* block);
 ZE_API void* ze_memcpy(void* target, const void* source, size_t size);

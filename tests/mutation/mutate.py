@@ -42,7 +42,7 @@ from mutants import standard_set, title
 SURVIVORS = pathlib.Path(__file__).resolve().parent / "survivors.txt"
 COPIED = FOLDERS + ["cmake", "tests", "CMakeLists.txt", "exports.txt"]
 
-UNIT_SECONDS = 8
+UNIT_SECONDS = 20
 DIFFERENTIAL_SECONDS = 3
 SANITIZED_SECONDS = 60
 MEMORY_LIMIT = 4 << 30

@@ -1,0 +1,73 @@
+#!/usr/bin/env python3
+"""Runs the commands that the project's pages show, but for those that .ci/run runs anyway.
+
+A command counts as run by .ci/run when it has the same verb of ./dev and no option that the line
+there lacks. What would take too long as it stands is run in a form of its own; SHORTER says in which
+and why. Exits with 1 when a command fails.
+"""
+
+import re
+import shlex
+import subprocess
+import sys
+
+sys.dont_write_bytecode = True
+from pages import ROOT, commands  # noqa: E402
+
+# What is run in place of a command whose beginning is this.
+SHORTER = {
+    # Minutes, and other libraries, for figures that nobody reads here.
+    "./dev bench": "./dev bench --no-peers --repetitions 1 --filter 'object box'",
+    # It takes a script; any will do.
+    "./dev play": "./dev play desktop/scripts/fig.strokes",
+    # A quarter of an hour for more cases of the same kind.
+    "./dev same-bits --size long": "./dev same-bits",
+    # It would rewrite a page; without it the same is measured and compared.
+    "./dev binary --update": "./dev binary",
+}
+
+
+def options(command):
+    return {word for word in shlex.split(command) if word.startswith("--")}
+
+
+def run_by_ci(command, ci_lines):
+    return any(shlex.split(line)[:2] == shlex.split(command)[:2] and
+               options(command) <= options(line) for line in ci_lines)
+
+
+def shortened(command):
+    for beginning, other in SHORTER.items():
+        if command.startswith(beginning):
+            command = other
+    return re.sub(r"--seconds \d+", "--seconds 1", command)
+
+
+def main():
+    ci_lines = re.findall(r"^\./dev .*", (ROOT / ".ci/run").read_text(encoding="utf-8"), re.M)
+    done = set()
+    failed = []
+    for command, page in commands().items():
+        form = shortened(command)
+        if run_by_ci(form, ci_lines):
+            print(f"{page}: {command}: run by .ci/run", flush=True)
+            continue
+        print(f"{page}: {command}: running {'it' if form == command else form}", flush=True)
+        if form in done:
+            continue
+        done.add(form)
+        run = subprocess.run(form, shell=True, cwd=ROOT, stdout=subprocess.PIPE,
+                             stderr=subprocess.STDOUT, text=True)
+        if run.returncode != 0:
+            failed.append(command)
+            print(run.stdout[-3000:], file=sys.stderr)
+            print(f"{page}: {command}: failed with status {run.returncode}", file=sys.stderr)
+    if not done:
+        print("no command was found in any page", file=sys.stderr)
+        return 1
+    print(f"{len(commands())} commands in the pages, {len(done)} run here, {len(failed)} failed")
+    return 1 if failed else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
