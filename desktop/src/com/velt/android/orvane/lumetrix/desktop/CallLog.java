@@ -1,13 +1,15 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.CallListener;
 import java.io.IOException;
 
-/** Is told of each call that a session makes on the library. */
-interface CallLog extends AutoCloseable {
+/** Is told of each call on the library that the selection or its digest depends on. */
+interface CallLog extends CallListener, AutoCloseable {
     /** Takes no notice. */
     CallLog NONE = (call, arguments) -> {};
 
-    void add(Call call, int... arguments);
+    /** The view that the digest shows is drawn, and the digest taken. */
+    default void digest() {}
 
     @Override
     default void close() throws IOException {}

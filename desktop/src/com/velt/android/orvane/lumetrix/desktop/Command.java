@@ -1,10 +1,13 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
 import android.graphics.Point;
-import android.graphics.Rect;
+import com.velt.android.orvane.lumetrix.selection.Area;
+import com.velt.android.orvane.lumetrix.selection.Mode;
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.io.IOException;
 import java.util.List;
 import java.util.function.Function;
+import java.util.stream.IntStream;
 
 /** One line of a script, after the photo. */
 sealed interface Command {
@@ -44,7 +47,7 @@ sealed interface Command {
         public void perform(Stage stage) {
             int spacing = DabPath.spacing(stage.session().brushRadius());
             List<Point> dabs = path.dabs(spacing);
-            Rect changed = stage.session().brush(mode, dabs);
+            Area changed = stage.session().brush(mode, coordinates(dabs));
             String where = span(path.points()) + " " + count(dabs.size(), "dab");
             addRow(stage, line, mode.toString(), where, changed);
         }
@@ -59,14 +62,14 @@ sealed interface Command {
 
         @Override
         public void perform(Stage stage) {
-            Rect changed = stage.session().lasso(mode, corners);
+            Area changed = stage.session().lasso(mode, coordinates(corners));
             String where = span(corners) + " " + count(corners.size(), "corner");
             addRow(stage, line, mode.toString(), where, changed);
         }
     }
 
     /** Something done to the whole selection. */
-    record Whole(int line, String what, Function<EditingSession, Rect> operation)
+    record Whole(int line, String what, Function<SelectionSession, Area> operation)
             implements Command {
         @Override
         public void perform(Stage stage) {
@@ -75,7 +78,7 @@ sealed interface Command {
     }
 
     /** A picture of the selection as it stands. */
-    record Snapshot(int line, String name, Function<EditingSession, Picture> drawing)
+    record Snapshot(int line, String name, Function<SelectionSession, Picture> drawing)
             implements Command {
         @Override
         public void perform(Stage stage) throws IOException {
@@ -83,8 +86,8 @@ sealed interface Command {
         }
     }
 
-    private static void addRow(Stage stage, int line, String what, String where, Rect changed) {
-        EditingSession session = stage.session();
+    private static void addRow(Stage stage, int line, String what, String where, Area changed) {
+        SelectionSession session = stage.session();
         stage.table().row(line, what, where, changed, session.selectedPixels(),
                 session.objectBox());
     }
@@ -97,6 +100,10 @@ sealed interface Command {
             throw new ScriptException(line, "the point " + describe(p) + " lies outside the photo",
                     "0,0 to " + (photo.width() - 1) + "," + (photo.height() - 1));
         }
+    }
+
+    private static int[] coordinates(List<Point> points) {
+        return points.stream().flatMapToInt(p -> IntStream.of(p.x, p.y)).toArray();
     }
 
     private static String span(List<Point> points) {

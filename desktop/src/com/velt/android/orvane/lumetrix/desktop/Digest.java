@@ -1,5 +1,7 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
+import com.velt.android.orvane.lumetrix.selection.Viewport;
 import java.util.Optional;
 import java.util.regex.Pattern;
 import java.util.zip.CRC32;
@@ -16,6 +18,14 @@ record Digest(int value) {
     static final int VIEW_HEIGHT = 480;
 
     private static final Pattern FORM = Pattern.compile("[0-9A-Fa-f]{8}");
+
+    /** Returns the digest of a session's selection and of how it looks. */
+    static Digest of(SelectionSession session) {
+        Viewport whole = Viewport.fitting(session.width(), session.height(), VIEW_WIDTH,
+                VIEW_HEIGHT);
+        Picture view = Drawings.view(session, whole, Drawings.WHITE, Drawings.BLACK);
+        return of(session.mask(), view.pixels());
+    }
 
     static Digest of(byte[] mask, int[] view) {
         CRC32 crc = new CRC32();

@@ -1,5 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.awt.image.BufferedImage;
 import java.awt.image.ColorModel;
 import java.awt.image.ComponentColorModel;
@@ -24,8 +25,7 @@ record Photo(int width, int height, int[] pixels) {
     /** Larger photos are refused: pixels, picture and copies for the library take 1.5 GB here. */
     static final int MOST_PIXELS = 64_000_000;
 
-    /** The library's view positions are 16.16 fixed point numbers and wrap beyond this column. */
-    static final int LONGEST_SIDE = 32767;
+    private static final int LONGEST_SIDE = SelectionSession.LONGEST_SIDE;
 
     /**
      * Reads a photo.

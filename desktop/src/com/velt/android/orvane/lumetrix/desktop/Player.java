@@ -1,5 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.io.IOException;
 import java.io.PrintStream;
 import java.nio.file.Files;
@@ -17,6 +18,8 @@ public final class Player {
     private static final int DONE = 0;
     private static final int OTHER_DIGEST = 1;
     private static final int NOT_PLAYED = 2;
+
+    private static final long NO_HISTORY = 0;  // a script has no undo
 
     private static final String HELP_HEAD = String.join("\n",
             "Usage: " + Options.USAGE,
@@ -87,10 +90,11 @@ public final class Player {
         for (Command command : script.commands()) command.check(photo);
         try (PictureFolder pictures = openFolder(script.snapshots());
                 CallLog calls = openLog(photo);
-                EditingSession session = new EditingSession(photo, calls)) {
+                SelectionSession session = open(photo, calls)) {
             perform(script.commands(), new Stage(session, new StrokeTable(out), pictures));
             commit(script.snapshots(), pictures);
-            Digest digest = session.digest();
+            calls.digest();
+            Digest digest = Digest.of(session);
             out.println("digest " + digest);
             return digest;
         } catch (IOException e) {
@@ -131,6 +135,11 @@ public final class Player {
     private CallLog openLog(Photo photo) throws IOException {
         if (options.recording().isEmpty()) return CallLog.NONE;
         return Recording.open(options.recording().get(), photo);
+    }
+
+    private static SelectionSession open(Photo photo, CallLog calls) {
+        return new SelectionSession(photo.pixels(), photo.width(), photo.height(), NO_HISTORY,
+                calls);
     }
 
     private void perform(List<Command> commands, Stage stage) throws ScriptException {

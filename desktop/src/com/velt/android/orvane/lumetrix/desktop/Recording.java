@@ -1,5 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.NativeCall;
 import java.io.ByteArrayOutputStream;
 import java.io.IOException;
 import java.io.OutputStream;
@@ -13,15 +14,17 @@ import java.nio.file.Path;
  * can make the same calls.
  *
  * <p>All numbers are 32 bits, the highest byte first: after {@link #MAGIC} width and height of the
- * photo and its pixels 0xAARRGGBB, row by row; then for each call a byte, {@link Call#number}, and
- * its arguments.
+ * photo and its pixels 0xAARRGGBB, row by row; then for each call a byte, its number, and its
+ * arguments.
  *
  * <p>The photo is written at once and the calls when it is closed. A file that was not written to
- * its end lacks {@link Call#DESTROY}.
+ * its end lacks the call {@link NativeCall#DESTROY}.
  */
 final class Recording implements CallLog {
     /** The first eight bytes. */
     static final byte[] MAGIC = "calls 1\n".getBytes(StandardCharsets.US_ASCII);
+
+    private static final int DIGEST = 7;
 
     private final OutputStream file;
     private final ByteArrayOutputStream calls = new ByteArrayOutputStream();
@@ -57,9 +60,14 @@ final class Recording implements CallLog {
     }
 
     @Override
-    public void add(Call call, int... arguments) {
-        calls.write(call.number());
+    public void beforeCall(NativeCall call, int... arguments) {
+        calls.write(numberOf(call));
         calls.writeBytes(bytes(arguments));
+    }
+
+    @Override
+    public void digest() {
+        calls.write(DIGEST);
     }
 
     @Override
@@ -67,6 +75,20 @@ final class Recording implements CallLog {
         try (file) {
             calls.writeTo(file);
         }
+    }
+
+    private static int numberOf(NativeCall call) {
+        return switch (call) {
+            case SET_BRUSH -> 1;
+            case INIT -> 2;
+            case MODIFY -> 3;
+            case INVERT -> 4;
+            case RESET -> 5;
+            case UPDATE_BOX -> 6;
+            case DESTROY -> 8;
+            case SET_BOX -> throw new IllegalStateException(
+                    "undo and redo cannot be recorded, expected a script of what is in effect");
+        };
     }
 
     private static byte[] bytes(int... numbers) {

@@ -1,7 +1,10 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
 import android.graphics.Point;
-import android.graphics.Rect;
+import com.velt.android.orvane.lumetrix.selection.Area;
+import com.velt.android.orvane.lumetrix.selection.Mode;
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
+import com.velt.android.orvane.lumetrix.selection.Viewport;
 import java.nio.ByteBuffer;
 import java.nio.charset.CharacterCodingException;
 import java.nio.charset.StandardCharsets;
@@ -16,8 +19,7 @@ import java.util.function.Function;
 
 /** Reads the text of a stroke script; one parser reads one script. */
 final class ScriptParser {
-    /** A dab of this radius covers three quarters of a million pixels and takes seconds. */
-    static final int LARGEST_RADIUS = 500;
+    private static final int LARGEST_RADIUS = SelectionSession.LARGEST_RADIUS;
 
     static final int LARGEST_VIEW_SIDE = 8192;
     static final float LARGEST_SCALE = 256;
@@ -45,24 +47,24 @@ final class ScriptParser {
             add(mode + " " + POINTS, words -> new Command.Stroke(words.line(), mode, path(words)));
         }
         add("lasso add|remove X,Y X,Y X,Y...", ScriptParser::lasso);
-        addWhole("invert", EditingSession::invert);
-        addWhole("reset", EditingSession::reset);
-        addWhole("update-box", EditingSession::updateBox);
+        addWhole("invert", SelectionSession::invert);
+        addWhole("reset", SelectionSession::reset);
+        addWhole("update-box", SelectionSession::updateBox);
         add("view FILE WIDTH HEIGHT SCALE OFFSETX OFFSETY [COLOUR COLOUR]", this::view);
-        addPicture("colour-on-grey", EditingSession::colourOnGrey);
-        addPicture("reverse", EditingSession::reverse);
-        addPicture("mask", EditingSession::maskPicture);
+        addPicture("colour-on-grey", Drawings::colourOnGrey);
+        addPicture("reverse", Drawings::reverse);
+        addPicture("mask", Drawings::mask);
     }
 
     private void add(String usage, Reading reading) {
         forms.put(usage.split(" ")[0], new Form(usage, reading));
     }
 
-    private void addWhole(String name, Function<EditingSession, Rect> operation) {
+    private void addWhole(String name, Function<SelectionSession, Area> operation) {
         add(name, words -> new Command.Whole(words.line(), name, operation));
     }
 
-    private void addPicture(String name, Function<EditingSession, Picture> drawing) {
+    private void addPicture(String name, Function<SelectionSession, Picture> drawing) {
         add(name + " FILE", words -> snapshot(words, pictureName(words), drawing));
     }
 
@@ -166,14 +168,14 @@ final class ScriptParser {
         int width = words.takeInteger("the view's width", 1, LARGEST_VIEW_SIDE);
         int height = words.takeInteger("the view's height", 1, LARGEST_VIEW_SIDE);
         float scale = words.takeDecimal("the photo pixels per view pixel", LARGEST_SCALE);
-        int side = Photo.LONGEST_SIDE;
+        int side = SelectionSession.LONGEST_SIDE;
         int offsetX = words.takeInteger("the photo column at the left", -side, side);
         int offsetY = words.takeInteger("the photo row at the top", -side, side);
         boolean coloured = words.hasNext();
-        int first = coloured ? words.takeColour() : Viewport.WHITE;
-        int second = coloured ? words.takeColour() : Viewport.BLACK;
-        Viewport port = new Viewport(width, height, scale, offsetX, offsetY, first, second);
-        return snapshot(words, name, session -> session.view(port));
+        int first = coloured ? words.takeColour() : Drawings.WHITE;
+        int second = coloured ? words.takeColour() : Drawings.BLACK;
+        Viewport port = new Viewport(width, height, scale, offsetX, offsetY);
+        return snapshot(words, name, session -> Drawings.view(session, port, first, second));
     }
 
     private String pictureName(Words words) throws ScriptException {
@@ -186,7 +188,7 @@ final class ScriptParser {
     }
 
     private static Command snapshot(Words words, String name,
-            Function<EditingSession, Picture> drawing) {
+            Function<SelectionSession, Picture> drawing) {
         return new Command.Snapshot(words.line(), name, drawing);
     }
 }

@@ -1,5 +1,7 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
+
 /**
  * What commands act on.
  *
@@ -7,4 +9,4 @@ package com.velt.android.orvane.lumetrix.desktop;
  * @param table receives a row from each command that works on the selection
  * @param pictures receives the pictures
  */
-record Stage(EditingSession session, StrokeTable table, PictureFolder pictures) {}
+record Stage(SelectionSession session, StrokeTable table, PictureFolder pictures) {}

@@ -1,6 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
-import android.graphics.Rect;
+import com.velt.android.orvane.lumetrix.selection.Area;
 import java.io.PrintStream;
 
 /** Prints one row for each command that works on the selection, as soon as it is done. */
@@ -14,17 +14,11 @@ final class StrokeTable {
         this.out = out;
     }
 
-    void row(int line, String what, String where, Rect changed, int selectedPixels, Rect box) {
+    void row(int line, String what, String where, Area changed, int selectedPixels, Area box) {
         if (!begun) {
             out.printf(ROW, "line", "what", "where", "changed", "selected", "object box");
             begun = true;
         }
-        out.printf(ROW, line, what, where, describe(changed), selectedPixels, describe(box));
-    }
-
-    /** Returns the columns and rows of a rectangle, first to last, or {@code none}. */
-    static String describe(Rect rect) {
-        if (rect.left > rect.right || rect.top > rect.bottom) return "none";
-        return rect.left + ".." + rect.right + " x " + rect.top + ".." + rect.bottom;
+        out.printf(ROW, line, what, where, changed, selectedPixels, box);
     }
 }

@@ -3,8 +3,10 @@ package com.velt.android.orvane.lumetrix.desktop;
 import static org.junit.jupiter.api.Assertions.assertArrayEquals;
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertThrows;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.awt.image.BufferedImage;
 import java.io.ByteArrayOutputStream;
 import java.io.DataOutputStream;
@@ -85,6 +87,22 @@ class RecordingTest {
         PlayerRun without = PlayerRun.of(script);
         assertFalse(Files.exists(file));
         assertEquals(without, PlayerRun.of(script, "--record", file));
+    }
+
+    @Test
+    void undoCannotBeRecordedAndIsRefusedBeforeItBegins() throws IOException {
+        Photo photo = new Photo(3, 2, new int[6]);
+        try (Recording recording = Recording.open(file, photo);
+                SelectionSession session =
+                        new SelectionSession(photo.pixels(), 3, 2, 1000, recording)) {
+            session.invert();
+            IllegalStateException e =
+                    assertThrows(IllegalStateException.class, session::undo);
+            assertEquals("undo and redo cannot be recorded, expected a script of what is in effect",
+                    e.getMessage());
+            assertEquals(6, session.selectedPixels());
+            assertTrue(session.canUndo());
+        }
     }
 
     @Test

@@ -5,6 +5,7 @@ import static org.junit.jupiter.api.Assertions.assertThrows;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import android.graphics.Point;
+import com.velt.android.orvane.lumetrix.selection.Mode;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Path;
 import java.util.List;

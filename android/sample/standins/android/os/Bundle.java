@@ -1,0 +1,4 @@
+package android.os;
+
+/** Stand-in for Android's class of this name. */
+public final class Bundle {}
