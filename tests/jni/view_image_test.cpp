@@ -118,6 +118,11 @@ TEST(draw_image, MirrorsAtANegativeScale) {
     EXPECT_EQ(drawn(4, 1, Pixels("abcd"), -0.5f, {1, 0}), Pixels("baaa"));
 }
 
+TEST(draw_image, GoesBackAcrossAPixelsEdgeAtTheSmallestNegativeScale) {
+    EXPECT_EQ(drawn(3, 2, Pixels("abc def"), -1.0f / 65536, {3, 1}), Pixels("fff ccc"));
+    EXPECT_EQ(drawn(3, 2, Pixels("abc def"), -1.0f / 65536, {2, 0}), Pixels("cbb cbb"));
+}
+
 TEST(draw_image, ShowsOnePhotoPixelAtScaleZeroAndNan) {
     for (const float scale : {0.0f, -0.0f, NAN, 1e-6f}) {
         EXPECT_EQ(drawn(3, 2, Pixels("abc def"), scale, {1, 1}), Pixels("eee eee")) << scale;

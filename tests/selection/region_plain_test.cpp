@@ -151,6 +151,24 @@ TEST(RegionPasses, FillARemovingLassoLikeThePlainPass) {
 }
 
 // Rows of more than 64 words, for whose sets of words one word is not enough.
+// Contours on the last column are seen beside the first, so a pixel that an earlier row left on the
+// far side begins an inside once a later region widens the area to it.
+TEST(RegionPasses, GoBackToEarlierRowsWhenTheAreaGetsWider) {
+    const Picture drawn(R"(
+        ...............................................................#
+        ...............................................................#
+        ..........................................................#.2...
+        ...............................................................#
+        ....................................................##.........#)");
+    Picture mask = drawn, plain_mask = drawn;
+    ze_rect rect = {64, 0, 5, 0}, plain_rect = rect;
+    Fill_Region(mask.data(), 64, 5, 0, 63, 0, 4, &rect);
+    plain::Fill_Region(plain_mask.data(), 64, 5, 0, 63, 0, 4, &plain_rect);
+    EXPECT_EQ(mask, plain_mask);
+    EXPECT_EQ(rect, plain_rect);
+    EXPECT_FALSE(mask == drawn);
+}
+
 TEST(RegionPasses, WorkOnRowsOfThousandsOfPixels) {
     for (const int width : {4030, 4096, 9000}) {
         Picture mask(width, 7, 0);
