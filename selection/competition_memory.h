@@ -28,10 +28,10 @@ constexpr int CLOSED = INT32_MIN;
 constexpr int UNREACHED = INT32_MAX;
 
 enum front_mark : unsigned char {
-    NOT_POPPED = 0,
-    STROKE_FRONT = 1,
-    KEEP_FRONT = 2,
-    BLOCKED_SEED = 3,  // queued and popped, and never won: its pixel has a foreign value
+    NOT_POPPED,
+    STROKE_FRONT,
+    KEEP_FRONT,
+    BLOCKED_SEED,  // queued and popped, and never won: its pixel has a foreign value
 };
 
 // Costs in the queue lie no further apart than one step costs, so modulo this none share a slot.

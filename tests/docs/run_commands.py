@@ -19,9 +19,12 @@ SHORTER = {
     # Minutes, and other libraries, for figures that nobody reads here.
     "./dev bench": "./dev bench --no-peers --repetitions 1 --filter 'object box'",
     # It takes a script; any will do.
-    "./dev play": "./dev play desktop/scripts/fig.strokes",
+    "./dev play": "./dev play desktop/scripts/fig.strokes --out out/play",
     # A quarter of an hour for more cases of the same kind.
     "./dev same-bits --size long": "./dev same-bits",
+    # They need an NDK; the test hands them what looks like one.
+    "cmake --preset android-": "./dev test -R '^android_presets$'",
+    "cmake --build --preset android-": "./dev test -R '^android_presets$'",
     # It would rewrite a page; without it the same is measured and compared.
     "./dev binary --update": "./dev binary",
 }

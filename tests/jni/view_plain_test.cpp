@@ -179,6 +179,50 @@ TEST(view_plain, EqualsTheFastLoopsInEveryRectangle) {
     }
 }
 
+// Pixels drawn earlier are then the photo of later ones.
+TEST(view_plain, EqualsTheFastLoopsWhereThePhotoIsTheView) {
+    for (int view_width = 1; view_width <= 6; ++view_width) {
+        for (int photo_width = 1; photo_width <= 6; ++photo_width) {
+            for (const int left : {0, view_width / 2, view_width - 1}) {
+                SCOPED_TRACE(testing::Message() << "view " << view_width << ", photo "
+                                                << photo_width << " wide, from " << left);
+                const ze_rect area = {left, view_width - 1, 0, 36 / view_width - 1};
+                const auto both = [&](auto draw, auto plain_draw) {
+                    std::vector<int32_t> drawn, plain_drawn;
+                    for (int i = 0; i < 36; ++i) drawn.push_back(i);
+                    plain_drawn = drawn;
+                    const int height = 36 / photo_width;
+                    draw(view_pixels{drawn.data(), view_width},
+                         photo_pixels{drawn.data(), photo_width, height});
+                    plain_draw(view_pixels{plain_drawn.data(), view_width},
+                               photo_pixels{plain_drawn.data(), photo_width, height});
+                    EXPECT_EQ(drawn, plain_drawn);
+                };
+                both([&](auto v, auto p) { draw_image(v, p, 0.5f, 1, 0, area); },
+                     [&](auto v, auto p) { plain::draw_image(v, p, 0.5f, 1, 0, area); });
+                both([&](auto v, auto p) { draw_small_image(v, p, area); },
+                     [&](auto v, auto p) { plain::draw_small_image(v, p, area); });
+                const std::vector<uint8_t> mask(36, 1);
+                const auto outlined = [&](const photo_pixels& p) {
+                    return outlined_photo{p, mask.data()};
+                };
+                both(
+                    [&](auto v, auto p) {
+                        draw_image_with_outline(v, outlined(p), 0.5f, 1, 0, DASHES, area);
+                    },
+                    [&](auto v, auto p) {
+                        plain::draw_image_with_outline(v, outlined(p), 0.5f, 1, 0, DASHES, area);
+                    });
+                both([&](auto v,
+                         auto p) { draw_small_image_with_outline(v, outlined(p), DASHES, area); },
+                     [&](auto v, auto p) {
+                         plain::draw_small_image_with_outline(v, outlined(p), DASHES, area);
+                     });
+            }
+        }
+    }
+}
+
 // Rows then overlap, and what is drawn later stays.
 TEST(view_plain, EqualsTheFastLoopsInARectangleWiderThanTheView) {
     random_source random(2);
