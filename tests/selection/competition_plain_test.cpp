@@ -191,29 +191,70 @@ TEST(Competition, TakesOldCostsUpToTheDearestStep) {
     EXPECT_EQ(engines.stroke(true, flat_photo(mask), &mask, 1, 1), stroke_run::FIRST);
 }
 
-// A corridor winds out from the core so far that the cost of its path wraps: every step is the
-// dearest, from black to white or back.
-TEST(Competition, WithPathsTooDearToCountIsCarriedOutPlainly) {
-    const int radius = 130, size = 2 * radius + 3, centre = radius + 1;
-    Picture mask(size, size, 5);  // closed to both fronts
-    const struct { int x, y; } turns[] = {{1, 0}, {0, 1}, {-1, 0}, {0, -1}};
-    int x = centre, y = centre, steps = 0;
-    mask.at(x, y) = 0;
-    for (int side = 0; side < 172; ++side) {
-        for (int i = 0; i < 2 * (side / 2 + 1); ++i, ++steps) {
-            x += turns[side % 4].x;
-            y += turns[side % 4].y;
-            mask.at(x, y) = 0;
+namespace {
+
+// A corridor that winds out from the core of a large brush, through a mask that is closed to both
+// fronts.
+struct corridor {
+    static constexpr int RADIUS = 130;
+    static constexpr int CENTRE = RADIUS + 1;
+    static constexpr int SIZE = 2 * RADIUS + 3;
+
+    explicit corridor(int steps) {
+        const struct { int x, y; } turns[] = {{1, 0}, {0, 1}, {-1, 0}, {0, -1}};
+        int x = CENTRE, y = CENTRE;
+        open(x, y);
+        for (int side = 0;; ++side) {
+            for (int i = 0; i < 2 * (side / 2 + 1); ++i) {
+                if (static_cast<int>(path.size()) > steps) return;
+                x += turns[side % 4].x;
+                y += turns[side % 4].y;
+                open(x, y);
+            }
         }
     }
-    ASSERT_GT(int64_t{steps} * 3 * 255 * 255, INT_MAX);
-    std::vector<int> photo;
-    for (int i = 0; i < size * size; ++i) photo.push_back((i % 2) * 0xFFFFFF);  // size is odd
-    engine_pair engines(radius, 0);
-    EXPECT_EQ(engines.stroke(true, photo, &mask, centre, centre), stroke_run::PLAIN);
-    mask = Picture(size, size, 0);
-    EXPECT_EQ(engines.stroke(true, photo, &mask, centre, centre), stroke_run::FIRST)
+
+    void open(int x, int y) {
+        mask.at(x, y) = 0;
+        path.push_back(static_cast<size_t>(y * SIZE + x));
+    }
+
+    Picture mask{SIZE, SIZE, 5};
+    std::vector<size_t> path;  // the core first
+    std::vector<int> photo = std::vector<int>(mask.cells.size(), 0);
+};
+
+constexpr int64_t DEAREST_STEP = 3 * 255 * 255;  // from black to white or back
+
+}  // namespace
+
+TEST(Competition, WithPathsTooDearToCountIsCarriedOutPlainly) {
+    const int steps = 14000;
+    ASSERT_GT(steps * DEAREST_STEP, INT_MAX);
+    corridor c(steps);
+    for (size_t i = 0; i < c.path.size(); i += 2) c.photo[c.path[i]] = 0xFFFFFF;
+    engine_pair engines(c.RADIUS, 0);
+    EXPECT_EQ(engines.stroke(true, c.photo, &c.mask, c.CENTRE, c.CENTRE), stroke_run::PLAIN);
+    c.mask = Picture(c.SIZE, c.SIZE, 0);
+    EXPECT_EQ(engines.stroke(true, c.photo, &c.mask, c.CENTRE, c.CENTRE), stroke_run::FIRST)
         << "nothing is left of the stroke given up";
+}
+
+// The last cell of its path costs INT_MAX, for which unreached cells stand.
+TEST(Competition, WithAPathThatCostsTheHighestNumberIsCarriedOutPlainly) {
+    const int dearest_steps = static_cast<int>(INT_MAX / DEAREST_STEP);
+    corridor c(2 + dearest_steps);
+    const int red = 143, green = 131, blue = 129;  // from black to it and from it to white ...
+    int64_t two_steps = 0;
+    for (const int level : {red, green, blue}) {
+        two_steps += level * level + (255 - level) * (255 - level);
+    }
+    ASSERT_EQ(two_steps + dearest_steps * DEAREST_STEP, INT_MAX);  // ... is what is left over
+    c.photo[c.path[1]] = red << 16 | green << 8 | blue;
+    for (size_t i = 2; i < c.path.size(); i += 2) c.photo[c.path[i]] = 0xFFFFFF;
+    engine_pair engines(c.RADIUS, 0);
+    EXPECT_EQ(engines.stroke(true, c.photo, &c.mask, c.CENTRE, c.CENTRE), stroke_run::PLAIN);
+    EXPECT_EQ(c.mask.cells[c.path.back()], 1);
 }
 
 // ---- strokes that do nothing
