@@ -331,7 +331,10 @@ def main():
 
     expected = Expected(project_version(arguments.version_of), arguments.headers,
                         ndk_release(arguments.ndk), arguments.twin)
-    results = faults_of(arguments.archive, expected)
+    try:
+        results = faults_of(arguments.archive, expected)
+    except (OSError, zipfile.BadZipFile) as e:
+        sys.exit(f"check_aar: {arguments.archive} cannot be unpacked: {e}; pack it anew")
     for what, faults in results.items():
         print(f"{'WRONG' if faults else 'ok':5}  {what}")
         for fault in faults:
