@@ -136,6 +136,13 @@ TEST(Competition, ThatBreaksTheOrderIsCarriedOutPlainly) {
     EXPECT_GT(runs[static_cast<size_t>(stroke_run::PLAIN)], 0);
 }
 
+// A stroke in which D_Queue's index asks a head for its `prev`: one that was queued alone has none,
+// one among few others has itself. One in a hundred thousand comes to that.
+TEST(Competition, TellsAHeadAloneFromOneAmongOthers) {
+    run_counts runs(4);
+    ASSERT_NO_FATAL_FAILURE(expect_equal_strokes(182617, 9, &runs));
+}
+
 TEST(Competition, OfLargeBrushesIsThePlainOne) {
     run_counts runs(4);
     for (unsigned seed = 1; seed <= 150; ++seed) {
