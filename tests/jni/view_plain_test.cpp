@@ -179,6 +179,21 @@ TEST(view_plain, EqualsTheFastLoopsInEveryRectangle) {
     }
 }
 
+// Stretches of one mask value are looked for where columns lie close together.
+TEST(view_plain, EqualsTheFastLoopsOnStretchesOfOneValueAtAnyScale) {
+    random_source random(3);
+    for (const float scale : {0.3f, 1.7f, 3.9f, 4.1f, 6.5f}) {
+        drawing d = {300, 3, 2000, 20, scale, 0, 0, {0, 299, 0, 2}, {}, {}};
+        for (int i = 0; i < 40000; ++i) d.photo.push_back(i);
+        for (int times = 0; times < 4 && !HasFailure(); ++times) {
+            d.mask = random_mask(random, 2000, 20);
+            compare(d, guard::BEHIND);
+        }
+        d.mask.assign(40000, 1);
+        compare(d, guard::BEHIND);
+    }
+}
+
 // Pixels drawn earlier are then the photo of later ones.
 TEST(view_plain, EqualsTheFastLoopsWhereThePhotoIsTheView) {
     for (int view_width = 1; view_width <= 6; ++view_width) {
