@@ -6,27 +6,15 @@
 
 #include <algorithm>
 #include <climits>
-#include <random>
 #include <vector>
 
 #include "selection/brush_cells.h"
 #include "selection/front_competition.h"
 #include "tests/helpers/picture.h"
+#include "tests/helpers/random_numbers.h"
 #include "tests/helpers/rect_printing.h"
 
 namespace {
-
-class random_numbers {
-public:
-    explicit random_numbers(unsigned seed) : numbers(seed) {}
-    int between(int low, int high) {
-        return low + static_cast<int>(numbers() % static_cast<unsigned>(high - low + 1));
-    }
-    bool one_in(int n) { return between(1, n) == 1; }
-
-private:
-    std::mt19937 numbers;
-};
 
 // One colour, a few colours, a gradient with a little noise, or pure noise.
 std::vector<int> random_photo(random_numbers& random, int width, int height) {

@@ -4,26 +4,16 @@
 
 #include <gtest/gtest.h>
 
-#include <random>
+#include <algorithm>
+#include <cstdlib>
 
 #include "selection/region_shaping.h"
 #include "tests/helpers/failing_allocations.h"
 #include "tests/helpers/picture.h"
+#include "tests/helpers/random_numbers.h"
 #include "tests/helpers/rect_printing.h"
 
 namespace {
-
-class random_numbers {
-public:
-    explicit random_numbers(unsigned seed) : numbers(seed) {}
-    int between(int low, int high) {
-        return low + static_cast<int>(numbers() % static_cast<unsigned>(high - low + 1));
-    }
-    bool one_in(int n) { return between(1, n) == 1; }
-
-private:
-    std::mt19937 numbers;
-};
 
 void draw_rectangle(Picture* mask, int left, int top, int width, int height, bool hollow,
                     unsigned char value) {
