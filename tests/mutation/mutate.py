@@ -40,7 +40,7 @@ from mutants import FOLDERS, ROOT, all_mutants, description, key, library_files,
 from mutants import standard_set, title
 
 SURVIVORS = pathlib.Path(__file__).resolve().parent / "survivors.txt"
-COPIED = FOLDERS + ["cmake", "tests", "CMakeLists.txt", "exports.txt"]
+COPIED = FOLDERS + ["cmake", "tests", "CMakeLists.txt", "draventaUtil.h", "exports.txt"]
 
 UNIT_SECONDS = 20
 DIFFERENTIAL_SECONDS = 3
