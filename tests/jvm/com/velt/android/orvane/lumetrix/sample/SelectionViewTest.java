@@ -119,6 +119,25 @@ class SelectionViewTest {
     }
 
     @Test
+    void aViewThatIsTurnedDuringATouchKeepsWhatWasSelected() {
+        touch(MotionEvent.ACTION_DOWN, WIDTH / 4, HEIGHT / 4);
+        int selected = view.selectedPixels();
+        assertNotEquals(0, selected);
+        view.layout(0, 0, HEIGHT / 2, WIDTH / 2);
+        touch(MotionEvent.ACTION_MOVE, 20, 20);
+        touch(MotionEvent.ACTION_UP, 20, 20);
+        assertEquals(selected, view.selectedPixels());
+    }
+
+    @Test
+    void aHugePhotoOnATinyViewTakesTheLargestBrush() {
+        view.layout(0, 0, 2, 2);
+        touch(MotionEvent.ACTION_DOWN, 1, 1);
+        touch(MotionEvent.ACTION_UP, 1, 1);
+        assertNotEquals(0, view.selectedPixels());
+    }
+
+    @Test
     void deselectingTakesAway() {
         touchCentre();
         int selected = view.selectedPixels();

@@ -78,9 +78,10 @@ public final class SelectionView extends View {
         port = Viewport.fitting(session.width(), session.height(), getWidth(), getHeight());
         pixels = new int[getWidth() * getHeight()];
         shown = Bitmap.createBitmap(getWidth(), getHeight(), Bitmap.Config.ARGB_8888);
-        int radius = Math.max(2, Math.round(BRUSH * port.scale()));
-        session.setBrush(Math.min(radius, SelectionSession.LARGEST_RADIUS),
-                Math.max(1, Math.round(radius * CORE_SHARE)));
+        finishStroke();  // the brush of a stroke stays what it is
+        int radius = Math.min(Math.max(2, Math.round(BRUSH * port.scale())),
+                SelectionSession.LARGEST_RADIUS);
+        session.setBrush(radius, Math.max(1, Math.round(radius * CORE_SHARE)));
         redraw();
     }
 
