@@ -10,7 +10,7 @@ import java.util.function.Function;
 import java.util.stream.IntStream;
 
 /** One line of a script, after the photo. */
-sealed interface Command {
+public sealed interface Command {
     /** Returns the line in the script, counted from 1. */
     int line();
 
@@ -47,9 +47,23 @@ sealed interface Command {
         public void perform(Stage stage) {
             int spacing = DabPath.spacing(stage.session().brushRadius());
             List<Point> dabs = path.dabs(spacing);
-            Area changed = stage.session().brush(mode, coordinates(dabs));
+            Area changed = draw(dabs, stage);
             String where = span(path.points()) + " " + count(dabs.size(), "dab");
-            addRow(stage, line, mode.toString(), where, changed);
+            stage.done(line, mode.toString(), where, changed);
+        }
+
+        private Area draw(List<Point> dabs, Stage stage) {
+            Area changed;
+            stage.session().begin(mode);
+            try {
+                for (Point dab : dabs) {
+                    stage.beforeDab();
+                    stage.session().dab(dab.x, dab.y);
+                }
+            } finally {
+                changed = stage.session().end();
+            }
+            return changed;
         }
     }
 
@@ -64,7 +78,7 @@ sealed interface Command {
         public void perform(Stage stage) {
             Area changed = stage.session().lasso(mode, coordinates(corners));
             String where = span(corners) + " " + count(corners.size(), "corner");
-            addRow(stage, line, mode.toString(), where, changed);
+            stage.done(line, mode.toString(), where, changed);
         }
     }
 
@@ -73,7 +87,7 @@ sealed interface Command {
             implements Command {
         @Override
         public void perform(Stage stage) {
-            addRow(stage, line, what, "", operation.apply(stage.session()));
+            stage.done(line, what, "", operation.apply(stage.session()));
         }
     }
 
@@ -82,14 +96,8 @@ sealed interface Command {
             implements Command {
         @Override
         public void perform(Stage stage) throws IOException {
-            stage.pictures().write(name, drawing.apply(stage.session()));
+            stage.picture(name, drawing);
         }
-    }
-
-    private static void addRow(Stage stage, int line, String what, String where, Area changed) {
-        SelectionSession session = stage.session();
-        stage.table().row(line, what, where, changed, session.selectedPixels(),
-                session.objectBox());
     }
 
     private static void checkInside(List<Point> points, Photo photo, int line)

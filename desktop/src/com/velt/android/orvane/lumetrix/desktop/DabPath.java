@@ -10,7 +10,7 @@ import java.util.List;
  *
  * @param stops the points in order; the first is joined to nothing
  */
-record DabPath(List<Stop> stops) {
+public record DabPath(List<Stop> stops) {
     /**
      * A point of the path.
      *
@@ -19,7 +19,7 @@ record DabPath(List<Stop> stops) {
      */
     record Stop(Point point, boolean joined) {}
 
-    DabPath {
+    public DabPath {
         stops = List.copyOf(stops);
     }
 
@@ -27,7 +27,7 @@ record DabPath(List<Stop> stops) {
      * Returns the distance between dabs on a joined stretch: half the brush's radius, so that
      * neighbouring dabs overlap well.
      */
-    static int spacing(int radius) {
+    public static int spacing(int radius) {
         return Math.max(1, radius / 2);
     }
 
@@ -43,7 +43,7 @@ record DabPath(List<Stop> stops) {
      * positions are rounded to nearest, halves up. Whole numbers only, so a path gives the same
      * dabs everywhere.
      */
-    List<Point> dabs(int spacing) {
+    public List<Point> dabs(int spacing) {
         List<Point> dabs = new ArrayList<>();
         Point from = null;
         for (Stop stop : stops) {

@@ -13,14 +13,14 @@ import java.util.zip.CRC32;
  *
  * @param value the 32 bits
  */
-record Digest(int value) {
+public record Digest(int value) {
     static final int VIEW_WIDTH = 640;
     static final int VIEW_HEIGHT = 480;
 
     private static final Pattern FORM = Pattern.compile("[0-9A-Fa-f]{8}");
 
     /** Returns the digest of a session's selection and of how it looks. */
-    static Digest of(SelectionSession session) {
+    public static Digest of(SelectionSession session) {
         Viewport whole = Viewport.fitting(session.width(), session.height(), VIEW_WIDTH,
                 VIEW_HEIGHT);
         Picture view = Drawings.view(session, whole, Drawings.WHITE, Drawings.BLACK);

@@ -5,35 +5,35 @@ import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import com.velt.android.orvane.lumetrix.selection.Viewport;
 
 /** Pictures of a session's photo and selection. */
-final class Drawings {
-    static final int WHITE = 0xFFFFFFFF;
-    static final int BLACK = 0xFF000000;
+public final class Drawings {
+    public static final int WHITE = 0xFFFFFFFF;
+    public static final int BLACK = 0xFF000000;
 
     private Drawings() {}
 
     /** Draws the photo with the selection's outline, dashed in two colours. */
-    static Picture view(SelectionSession session, Viewport port, int firstColour,
+    public static Picture view(SelectionSession session, Viewport port, int firstColour,
             int secondColour) {
         Picture view = blank(port.width(), port.height());
         session.drawOutlinedView(view.pixels(), port, port.area(), firstColour, secondColour);
         return view;
     }
 
-    static Picture colourOnGrey(SelectionSession session) {
+    public static Picture colourOnGrey(SelectionSession session) {
         Picture picture = blankOf(session);
         session.drawColourOnGrey(picture.pixels(),
                 new Area(0, 0, session.width() - 1, session.height() - 1));
         return picture;
     }
 
-    static Picture reverse(SelectionSession session) {
+    public static Picture reverse(SelectionSession session) {
         Picture picture = blankOf(session);
         session.drawReverse(picture.pixels());
         return picture;
     }
 
     /** Draws selected pixels white and all others black. */
-    static Picture mask(SelectionSession session) {
+    public static Picture mask(SelectionSession session) {
         Picture picture = blankOf(session);
         byte[] mask = session.mask();
         for (int i = 0; i < mask.length; ++i) picture.pixels()[i] = mask[i] == 1 ? WHITE : BLACK;

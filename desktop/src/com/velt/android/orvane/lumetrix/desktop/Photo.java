@@ -21,9 +21,9 @@ import javax.imageio.stream.ImageInputStream;
  * @param height height in pixels
  * @param pixels width * height values 0xAARRGGBB, row by row
  */
-record Photo(int width, int height, int[] pixels) {
+public record Photo(int width, int height, int[] pixels) {
     /** Larger photos are refused: pixels, picture and copies for the library take 1.5 GB here. */
-    static final int MOST_PIXELS = 64_000_000;
+    public static final int MOST_PIXELS = 64_000_000;
 
     private static final int LONGEST_SIDE = SelectionSession.LONGEST_SIDE;
 
@@ -36,7 +36,7 @@ record Photo(int width, int height, int[] pixels) {
      *
      * @throws IOException when there is no photo that can be had; the message says why
      */
-    static Photo read(Path file) throws IOException {
+    public static Photo read(Path file) throws IOException {
         if (!Files.isRegularFile(file)) throw new IOException("there is no such file");
         try (ImageInputStream in = ImageIO.createImageInputStream(file.toFile())) {
             if (in == null) throw new IOException("it cannot be opened");

@@ -9,7 +9,7 @@ import java.awt.image.BufferedImage;
  * @param height height in pixels
  * @param pixels width * height values 0xAARRGGBB, row by row
  */
-record Picture(int width, int height, int[] pixels) {
+public record Picture(int width, int height, int[] pixels) {
     /** Returns the picture for a file, without an alpha channel when no pixel needs one. */
     BufferedImage toImage() {
         boolean opaque = true;

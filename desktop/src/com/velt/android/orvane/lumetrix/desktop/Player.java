@@ -1,5 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
+import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.io.IOException;
 import java.io.PrintStream;
@@ -7,6 +8,7 @@ import java.nio.file.Files;
 import java.nio.file.InvalidPathException;
 import java.nio.file.Path;
 import java.util.List;
+import java.util.function.Function;
 
 /**
  * Plays a stroke script: prints a row for each stroke, writes the script's pictures, and ends with
@@ -84,6 +86,21 @@ public final class Player {
         return NOT_PLAYED;
     }
 
+    /** Prints a row for each command and keeps the pictures. */
+    private record PlayerStage(SelectionSession session, StrokeTable table, PictureFolder pictures)
+            implements Stage {
+        @Override
+        public void done(int line, String what, String where, Area changed) {
+            table.row(line, what, where, changed, session.selectedPixels(), session.objectBox());
+        }
+
+        @Override
+        public void picture(String name, Function<SelectionSession, Picture> drawing)
+                throws IOException {
+            pictures.write(name, drawing.apply(session));
+        }
+    }
+
     private Digest play() throws ScriptException {
         Script script = readScript();
         Photo photo = readPhoto(script);
@@ -91,7 +108,7 @@ public final class Player {
         try (PictureFolder pictures = openFolder(script.snapshots());
                 CallLog calls = openLog(photo);
                 SelectionSession session = open(photo, calls)) {
-            perform(script.commands(), new Stage(session, new StrokeTable(out), pictures));
+            perform(script.commands(), new PlayerStage(session, new StrokeTable(out), pictures));
             commit(script.snapshots(), pictures);
             calls.digest();
             Digest digest = Digest.of(session);

@@ -9,8 +9,8 @@ import java.util.List;
  * @param photo the photo's file, as the script names it: relative to the script's folder
  * @param commands what to do with it, in order
  */
-record Script(int photoLine, String photo, List<Command> commands) {
-    Script {
+public record Script(int photoLine, String photo, List<Command> commands) {
+    public Script {
         commands = List.copyOf(commands);
     }
 

@@ -3,7 +3,7 @@ package com.velt.android.orvane.lumetrix.desktop;
 import java.nio.file.Path;
 
 /** A script that cannot be played: where, what is wrong, and what was expected. */
-final class ScriptException extends Exception {
+public final class ScriptException extends Exception {
     private static final long serialVersionUID = 1;
 
     /** Stands for the line when the trouble is the file itself. */
@@ -17,7 +17,7 @@ final class ScriptException extends Exception {
     }
 
     /** Returns the message as {@code FILE:LINE: what is wrong, what was expected}. */
-    String in(Path script) {
+    public String in(Path script) {
         String place = line == WHOLE_FILE ? script.toString() : script + ":" + line;
         return place + ": " + getMessage();
     }

@@ -18,7 +18,7 @@ import java.util.Set;
 import java.util.function.Function;
 
 /** Reads the text of a stroke script; one parser reads one script. */
-final class ScriptParser {
+public final class ScriptParser {
     private static final int LARGEST_RADIUS = SelectionSession.LARGEST_RADIUS;
 
     static final int LARGEST_VIEW_SIDE = 8192;
@@ -78,7 +78,7 @@ final class ScriptParser {
     }
 
     /** Parses the bytes of a script. */
-    static Script parse(byte[] utf8) throws ScriptException {
+    public static Script parse(byte[] utf8) throws ScriptException {
         ScriptParser parser = new ScriptParser();
         int line = 0;
         for (int from = 0; from < utf8.length; ) {

@@ -3,6 +3,7 @@ package com.velt.android.orvane.lumetrix.desktop;
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.CallListener;
 import com.velt.android.orvane.lumetrix.selection.Mode;
 import com.velt.android.orvane.lumetrix.selection.RandomStrokes;
@@ -10,13 +11,12 @@ import com.velt.android.orvane.lumetrix.selection.RandomStrokes.State;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.awt.image.BufferedImage;
 import java.io.IOException;
-import java.io.OutputStream;
-import java.io.PrintStream;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
 import java.util.List;
 import java.util.Random;
+import java.util.function.Function;
 import javax.imageio.ImageIO;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
@@ -185,11 +185,18 @@ class RecordedScriptTest {
 
     private static void replay(String script, SelectionSession session)
             throws IOException, ScriptException {
-        StrokeTable table = new StrokeTable(new PrintStream(OutputStream.nullOutputStream()));
-        Stage stage = new Stage(session, table, null);  // there are no pictures
+        Stage stage = new SilentStage(session);
         List<Command> commands =
                 ScriptParser.parse(script.getBytes(StandardCharsets.UTF_8)).commands();
         for (Command command : commands) command.perform(stage);
+    }
+
+    private record SilentStage(SelectionSession session) implements Stage {
+        @Override
+        public void done(int line, String what, String where, Area changed) {}
+
+        @Override
+        public void picture(String name, Function<SelectionSession, Picture> drawing) {}
     }
 
     private static long historyOf(Random random) {
