@@ -68,15 +68,35 @@ std::vector<int32_t> take_pixels(byte_reader* in, size_t count) {
     return pixels;
 }
 
-recorded_call take_call(byte_reader* in) {
+pixel_run take_run(byte_reader* in, int32_t width, int32_t height) {
+    const size_t position = in->position();
+    pixel_run run = {};
+    for (int32_t* number : {&run.row, &run.first, &run.last}) *number = in->take_number("a call");
+    const bool in_the_photo = run.row >= 0 && run.row < height && run.first >= 0 &&
+                              run.first <= run.last && run.last < width;
+    if (in_the_photo) return run;
+    refuse("the photo has no run " + std::to_string(run.first) + " to " + std::to_string(run.last) +
+           " in row " + std::to_string(run.row) + byte_number(position));
+}
+
+std::vector<pixel_run> take_runs(byte_reader* in, int32_t width, int32_t height) {
+    const auto count = static_cast<uint32_t>(in->take_number("a call"));
+    if (count > in->numbers_left() / 3) refuse("it ends inside a call");
+    std::vector<pixel_run> runs(count);
+    for (pixel_run& run : runs) run = take_run(in, width, height);
+    return runs;
+}
+
+recorded_call take_call(byte_reader* in, int32_t width, int32_t height) {
     const size_t position = in->position();
     const unsigned number = in->take_byte();
-    if (number < 1 || number > static_cast<unsigned>(call_kind::destroy)) {
+    if (number < 1 || number > static_cast<unsigned>(call_kind::select)) {
         refuse("there is no call " + std::to_string(number) + byte_number(position));
     }
-    recorded_call call = {static_cast<call_kind>(number), {}};
+    recorded_call call = {static_cast<call_kind>(number), {}, {}};
     const size_t count = argument_count(call.kind);
     for (size_t i = 0; i < count; ++i) call.arguments[i] = in->take_number("a call");
+    if (call.kind == call_kind::select) call.runs = take_runs(in, width, height);
     return call;
 }
 
@@ -99,7 +119,7 @@ recording parse_recording(const std::string& bytes) {
     r.width = take_side(&in, "width");
     r.height = take_side(&in, "height");
     r.pixels = take_pixels(&in, static_cast<size_t>(r.width) * static_cast<size_t>(r.height));
-    while (!in.at_end()) r.calls.push_back(take_call(&in));
+    while (!in.at_end()) r.calls.push_back(take_call(&in, r.width, r.height));
     if (!ends_with_a_digest(r.calls))
         refuse("it does not end with a digest, taken once, and the session's end");
     return r;

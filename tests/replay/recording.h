@@ -16,12 +16,21 @@ enum class call_kind : uint8_t {
     reset,
     update_box,
     digest,
-    destroy
+    destroy,
+    select
+};
+
+// Pixels of a row of the photo, first <= last.
+struct pixel_run {
+    int32_t row;
+    int32_t first;
+    int32_t last;
 };
 
 struct recorded_call {
     call_kind kind;
     std::array<int32_t, 6> arguments;  // as many as the kind has, then zeros
+    std::vector<pixel_run> runs;       // of select; the pixels that it selects
 };
 
 struct recording {

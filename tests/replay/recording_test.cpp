@@ -5,6 +5,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
+
 #include "tests/replay/digest.h"
 
 using testing::ElementsAre;
@@ -22,6 +24,12 @@ std::string bytes(const std::string& digits) {
         all += static_cast<char>(std::stoi(digit_pair, nullptr, 16));
         digit_pair.clear();
     }
+    return all;
+}
+
+std::string repeated(const std::string& text, int times) {
+    std::string all;
+    for (int i = 0; i < times; ++i) all += text;
     return all;
 }
 
@@ -59,6 +67,53 @@ TEST(recording, HoldsPhotoAndCalls) {
     EXPECT_THAT(r.calls[2].arguments, ElementsAre(5, 1, 0, 1, -1, 500));
 }
 
+TEST(recording, HoldsTheRunsThatAreSelected) {
+    const recording r = parse_recording(
+        HEAD + bytes("00000003 00000002" + repeated("FF000000", 6)) +
+        bytes("09 00000000  09 00000003  00000000 00000000 00000000  00000000 00000002 00000002"
+              "00000001 00000000 00000002  04") +
+        END);
+    ASSERT_EQ(r.calls.size(), 5u);
+    EXPECT_EQ(r.calls[0].kind, call_kind::select);
+    EXPECT_EQ(r.calls[0].runs.size(), 0u);
+    EXPECT_EQ(r.calls[1].kind, call_kind::select);
+    EXPECT_EQ(r.calls[2].kind, call_kind::invert);
+
+    std::vector<std::array<int32_t, 3>> runs;
+    for (const pixel_run& run : r.calls[1].runs) runs.push_back({run.row, run.first, run.last});
+    EXPECT_THAT(runs, ElementsAre(std::array<int32_t, 3>{0, 0, 0}, std::array<int32_t, 3>{0, 2, 2},
+                                  std::array<int32_t, 3>{1, 0, 2}));
+}
+
+TEST(recording, HasMoreRunsThanItHolds) {
+    // No memory is asked for what is not there.
+    for (const char* count : {"00000001", "00000002", "7FFFFFFF", "80000000", "FFFFFFFF"}) {
+        EXPECT_EQ(fault_in(HEAD + PHOTO + bytes(std::string("09") + count) + END),
+                  "it ends inside a call")
+            << count;
+    }
+    EXPECT_EQ(fault_in(HEAD + PHOTO + bytes("09 0000")), "it ends inside a call");
+    EXPECT_EQ(fault_in(HEAD + PHOTO + bytes("09 00000002 00000000 00000000 00000000") + END),
+              "it ends inside a call");
+}
+
+TEST(recording, HasARunBeyondThePhoto) {
+    const auto fault_in_run = [](const std::string& run) {
+        return fault_in(HEAD + PHOTO + bytes("09 00000001" + run) + END);
+    };
+    ASSERT_EQ(fault_in_run("00000000 00000000 00000001"), "none");
+    EXPECT_EQ(fault_in_run("00000001 00000000 00000001"),
+              "the photo has no run 0 to 1 in row 1 at byte 29");
+    EXPECT_EQ(fault_in_run("FFFFFFFF 00000000 00000001"),
+              "the photo has no run 0 to 1 in row -1 at byte 29");
+    EXPECT_EQ(fault_in_run("00000000 00000001 00000000"),
+              "the photo has no run 1 to 0 in row 0 at byte 29");
+    EXPECT_EQ(fault_in_run("00000000 FFFFFFFF 00000001"),
+              "the photo has no run -1 to 1 in row 0 at byte 29");
+    EXPECT_EQ(fault_in_run("00000000 00000000 00000002"),
+              "the photo has no run 0 to 2 in row 0 at byte 29");
+}
+
 TEST(recording, MissesItsHead) {
     EXPECT_EQ(fault_in(""), "it does not begin with \"calls 1\"");
     EXPECT_EQ(fault_in("calls 2\n" + PHOTO + END), "it does not begin with \"calls 1\"");
@@ -73,7 +128,8 @@ TEST(recording, HasASizeThatNoPhotoHas) {
 }
 
 TEST(recording, IsFoundShortAtEachPlace) {
-    const std::string whole = HEAD + PHOTO + bytes("01 0000000A 00000001") + END;
+    const std::string whole =
+        HEAD + PHOTO + bytes("01 0000000A 00000001  09 00000001 00000000 00000001 00000001") + END;
     ASSERT_EQ(fault_in(whole), "none");
     for (size_t length = 0; length < whole.size(); ++length) {
         EXPECT_NE(fault_in(whole.substr(0, length)), "none") << "of " << length << " bytes";
@@ -84,7 +140,7 @@ TEST(recording, IsFoundShortAtEachPlace) {
 }
 
 TEST(recording, HasACallThatIsNone) {
-    EXPECT_EQ(fault_in(HEAD + PHOTO + bytes("02 09") + END), "there is no call 9 at byte 25");
+    EXPECT_EQ(fault_in(HEAD + PHOTO + bytes("02 0A") + END), "there is no call 10 at byte 25");
     EXPECT_EQ(fault_in(HEAD + PHOTO + bytes("00") + END), "there is no call 0 at byte 24");
 }
 

@@ -5,6 +5,7 @@
 #include <jni.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
@@ -108,6 +109,9 @@ public:
             case call_kind::update_box:
                 UTIL_METHOD(update_1objectROI)(&env, util, mask, width, height);
                 break;
+            case call_kind::select:
+                select(call.runs);
+                break;
             case call_kind::digest:
                 take_digest();
                 break;
@@ -131,6 +135,20 @@ private:
         fake_rect changed("changed", {});
         UTIL_METHOD(modify_1objectsel)
         (&env, util, photo, mask, width, height, p1, p2, mode, changed, fill);
+    }
+
+    // Writes into the mask as Java code does, and measures the object box from scratch.
+    void select(const std::vector<pixel_run>& runs) {
+        jbyte* pixels = env.GetByteArrayElements(mask, nullptr);
+        std::fill_n(pixels, ptrdiff_t{width} * height, jbyte{0});
+        for (const pixel_run& run : runs) {
+            jbyte* row = pixels + ptrdiff_t{run.row} * width;
+            std::fill(row + run.first, row + run.last + 1, jbyte{1});
+        }
+        env.ReleaseByteArrayElements(mask, pixels, 0);
+        fake_rect whole("whole", {0, width - 1, 0, height - 1});
+        UTIL_METHOD(set_1objectROI)(&env, util, whole);
+        UTIL_METHOD(update_1objectROI)(&env, util, mask, width, height);
     }
 
     void take_digest() {

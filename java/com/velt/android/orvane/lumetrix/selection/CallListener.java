@@ -13,7 +13,8 @@ public interface CallListener {
      * step half done.
      *
      * @param call which call
-     * @param arguments its arguments, as {@link NativeCall} lists them
+     * @param arguments its arguments, as {@link NativeCall} lists them; change nothing in the
+     *     array, for the call reads it
      */
     void beforeCall(NativeCall call, int... arguments);
 }

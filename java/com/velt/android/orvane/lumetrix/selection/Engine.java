@@ -78,6 +78,14 @@ final class Engine {
         Util.reset_objectsel(mask, width, height);
     }
 
+    /** Selects the pixels of the runs and no others, and measures the object box from scratch. */
+    void select(int[] runs) {
+        listener.beforeCall(NativeCall.SELECT, runs);
+        PixelRuns.write(runs, mask, width);
+        Util.set_objectROI(new Rect(0, 0, width - 1, height - 1));
+        Util.update_objectROI(mask, width, height);
+    }
+
     void updateBox() {
         listener.beforeCall(NativeCall.UPDATE_BOX);
         Util.update_objectROI(mask, width, height);

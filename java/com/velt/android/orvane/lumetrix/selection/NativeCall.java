@@ -18,6 +18,14 @@ public enum NativeCall {
     INVERT,
     /** {@code reset_objectsel}. */
     RESET,
+    /**
+     * Three things at once: the session makes the pixels of the given runs 1 in the mask and all
+     * others 0; {@code set_objectROI} of the whole photo, that is 0, 0, width - 1, height - 1; and
+     * {@code update_objectROI}. Arguments: row, first and last column of each run of selected
+     * pixels in a row, in reading order, with a pixel that is not selected between two of a row;
+     * none when nothing is selected.
+     */
+    SELECT,
     /** {@code update_objectROI}. */
     UPDATE_BOX,
     /**

@@ -33,10 +33,10 @@ import java.util.concurrent.atomic.AtomicReference;
  *
  * <h2>Undo</h2>
  *
- * <p>A step is a stroke, {@link #invert}, {@link #reset} or {@link #updateBox}. Undo and redo bring
- * back mask and object box exactly; brush and fill flag stay as they are. What changed neither is
- * no step: undo passes over it, and what was undone can still be redone. Any other step forgets
- * what was undone.
+ * <p>A step is a stroke, {@link #invert}, {@link #reset}, {@link #select} or {@link #updateBox}.
+ * Undo and redo bring back mask and object box exactly; brush and fill flag stay as they are. What
+ * changed neither is no step: undo passes over it, and what was undone can still be redone. Any
+ * other step forgets what was undone.
  *
  * <p>Deliberate: the engine remembers colour costs along the photo's first row and column from
  * stroke to stroke, until its brush is set. Undo and redo set the brush again, so a stroke there
@@ -50,13 +50,17 @@ import java.util.concurrent.atomic.AtomicReference;
  * {@link #DEFAULT_HISTORY_BYTES}: each 256 bytes, and 3 to 11 for each run of changed pixels in a
  * row. Beyond the limit the oldest are forgotten. A step that exceeds it alone is not kept, and
  * neither is any before it: {@link #canUndo} is false then. For the script, 8 bytes a dab and some
- * 150 a stroke stay as long as the session is open, whatever the limit.
+ * 150 a stroke stay as long as the session is open, whatever the limit. Of each {@link #select} in
+ * effect or undone, its line of the script stays as well: 4 to 12 bytes for each run of selected
+ * pixels in a row and up to 7 for each such row. That is tens of kilobytes for an object in a large
+ * photo, and up to five or six bytes a pixel where every second one is selected.
  *
  * <p>When a step ends, the mask is compared with its copy where it may have changed; with filling
- * that is the object box. The step takes up to three times its bytes for that moment, and
- * {@link #drawReverse} a byte a pixel. A virtual machine that copies arrays for native methods
- * copies the mask for each dab and each segment of a lasso, and for growing and shrinking the photo
- * as well: on a large photo that takes longer than the stroke itself.
+ * that is the object box. The step takes up to three times its bytes for that moment,
+ * {@link #select} 12 bytes a run and three times its line, and {@link #drawReverse} a byte a pixel.
+ * A virtual machine that copies arrays for native methods copies the mask for each dab and each
+ * segment of a lasso, and for growing and shrinking the photo as well: on a large photo that takes
+ * longer than the stroke itself.
  */
 public final class SelectionSession implements AutoCloseable {
     /** The longest side of a photo: positions are 16.16 fixed point numbers and wrap beyond. */
@@ -338,7 +342,7 @@ public final class SelectionSession implements AutoCloseable {
      * @return the whole photo
      */
     public Area invert() {
-        return changeWhole("invert", engine::invert, whole());
+        return changeWhole("invert", engine::invert, whole(), Area.EMPTY);
     }
 
     /**
@@ -347,7 +351,30 @@ public final class SelectionSession implements AutoCloseable {
      * @return the whole photo
      */
     public Area reset() {
-        return changeWhole("reset", engine::reset, whole());
+        return changeWhole("reset", engine::reset, whole(), Area.EMPTY);
+    }
+
+    /**
+     * Takes over a selection, such as one that was saved, in place of the present one. Open
+     * outlines of lassos are gone afterwards, and the object box is the tight one around what is
+     * selected.
+     *
+     * <p>Deliberate: selecting nothing where nothing is selected may be a step all the same; the
+     * library has two empty object boxes, and a session begins with the other one.
+     *
+     * @param selection width * height bytes, row by row: 1 is selected, any other value is not. It
+     *     is read, not kept.
+     * @return what has changed in the mask
+     * @throws NullPointerException when {@code selection} is null
+     * @throws IllegalArgumentException when it has another length
+     */
+    public Area select(byte[] selection) {
+        checkNoStroke();
+        Checks.notNull("the selection", selection);
+        Checks.length("the selection", selection.length, width, height);
+        int[] runs = PixelRuns.of(selection, width);
+        return changeWhole("select" + PixelRuns.words(runs), () -> engine.select(runs), Area.EMPTY,
+                whole());
     }
 
     /**
@@ -356,14 +383,14 @@ public final class SelectionSession implements AutoCloseable {
      * @return {@link Area#EMPTY}: no pixel changes
      */
     public Area updateBox() {
-        return changeWhole("update-box", engine::updateBox, Area.EMPTY);
+        return changeWhole("update-box", engine::updateBox, Area.EMPTY, Area.EMPTY);
     }
 
-    private Area changeWhole(String words, Runnable operation, Area changed) {
+    private Area changeWhole(String words, Runnable operation, Area changed, Area touched) {
         checkNoStroke();
         stroke = newStroke(words);
         operation.run();
-        stroke.addChange(changed, Area.EMPTY);
+        stroke.addChange(changed, touched);
         return finish();
     }
 

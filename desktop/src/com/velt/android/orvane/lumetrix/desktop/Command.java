@@ -91,6 +91,27 @@ public sealed interface Command {
         }
     }
 
+    /** A selection in place of the one before. */
+    record Select(int line, SelectedRuns runs) implements Command {
+        @Override
+        public void check(Photo photo) throws ScriptException {
+            for (int i = 0; i < runs.count(); ++i) {
+                boolean inside = runs.row(i) < photo.height() && runs.last(i) < photo.width();
+                if (inside) continue;
+                throw new ScriptException(line, "the run " + runs.first(i) + "-" + runs.last(i)
+                        + " of row " + runs.row(i) + " reaches beyond the photo", "rows 0 to "
+                        + (photo.height() - 1) + " and columns 0 to " + (photo.width() - 1));
+            }
+        }
+
+        @Override
+        public void perform(Stage stage) {
+            SelectionSession session = stage.session();
+            Area changed = session.select(runs.mask(session.width(), session.height()));
+            stage.done(line, "select", count(runs.rows(), "row"), changed);
+        }
+    }
+
     /** A picture of the selection as it stands. */
     record Snapshot(int line, String name, Function<SelectionSession, Picture> drawing)
             implements Command {

@@ -36,31 +36,38 @@ public record DabPath(List<Stop> stops) {
         return stops.stream().map(Stop::point).toList();
     }
 
-    /**
-     * Returns all dabs, in order.
-     *
-     * <p>A stretch is cut into the fewest equal steps whose longer side is at most {@code spacing};
-     * positions are rounded to nearest, halves up. Whole numbers only, so a path gives the same
-     * dabs everywhere.
-     */
+    /** Returns all dabs, in order; those of a joined stretch as {@link #between} sets them. */
     public List<Point> dabs(int spacing) {
         List<Point> dabs = new ArrayList<>();
         Point from = null;
         for (Stop stop : stops) {
-            if (stop.joined()) addBetween(from, stop.point(), spacing, dabs);
-            dabs.add(stop.point());
+            if (stop.joined()) {
+                dabs.addAll(between(from, stop.point(), spacing));
+            } else {
+                dabs.add(stop.point());
+            }
             from = stop.point();
         }
         return dabs;
     }
 
-    private static void addBetween(Point from, Point to, int spacing, List<Point> dabs) {
+    /**
+     * Returns the dabs that lead from one point to another, which is the last of them.
+     *
+     * <p>The stretch is cut into the fewest equal steps whose longer side is at most
+     * {@code spacing}; positions are rounded to nearest, halves up. Whole numbers only, so a path
+     * gives the same dabs everywhere.
+     */
+    public static List<Point> between(Point from, Point to, int spacing) {
+        List<Point> dabs = new ArrayList<>();
         int dx = to.x - from.x;
         int dy = to.y - from.y;
         int steps = (Math.max(Math.abs(dx), Math.abs(dy)) + spacing - 1) / spacing;
         for (int i = 1; i < steps; ++i) {
             dabs.add(new Point(from.x + share(dx, i, steps), from.y + share(dy, i, steps)));
         }
+        dabs.add(to);
+        return dabs;
     }
 
     /** Returns {@code distance * i / steps}, rounded to nearest, halves up. */

@@ -11,7 +11,7 @@ import java.awt.image.BufferedImage;
  */
 public record Picture(int width, int height, int[] pixels) {
     /** Returns the picture for a file, without an alpha channel when no pixel needs one. */
-    BufferedImage toImage() {
+    public BufferedImage toImage() {
         boolean opaque = true;
         for (int pixel : pixels) opaque &= pixel >>> 24 == 255;
         int type = opaque ? BufferedImage.TYPE_INT_RGB : BufferedImage.TYPE_INT_ARGB;

@@ -15,7 +15,7 @@ import java.nio.file.Path;
  *
  * <p>All numbers are 32 bits, the highest byte first: after {@link #MAGIC} width and height of the
  * photo and its pixels 0xAARRGGBB, row by row; then for each call a byte, its number, and its
- * arguments.
+ * arguments. Those of {@link NativeCall#SELECT} come after the number of its runs.
  *
  * <p>The photo is written at once and the calls when it is closed. A file that was not written to
  * its end lacks the call {@link NativeCall#DESTROY}.
@@ -25,6 +25,7 @@ final class Recording implements CallLog {
     static final byte[] MAGIC = "calls 1\n".getBytes(StandardCharsets.US_ASCII);
 
     private static final int DIGEST = 7;
+    private static final int NUMBERS_OF_A_RUN = 3;
 
     private final OutputStream file;
     private final ByteArrayOutputStream calls = new ByteArrayOutputStream();
@@ -62,6 +63,7 @@ final class Recording implements CallLog {
     @Override
     public void beforeCall(NativeCall call, int... arguments) {
         calls.write(numberOf(call));
+        if (call == NativeCall.SELECT) calls.writeBytes(bytes(arguments.length / NUMBERS_OF_A_RUN));
         calls.writeBytes(bytes(arguments));
     }
 
@@ -86,6 +88,7 @@ final class Recording implements CallLog {
             case RESET -> 5;
             case UPDATE_BOX -> 6;
             case DESTROY -> 8;
+            case SELECT -> 9;
             case SET_BOX -> throw new IllegalStateException(
                     "undo and redo cannot be recorded, expected a script of what is in effect");
         };

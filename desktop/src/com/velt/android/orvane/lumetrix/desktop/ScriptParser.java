@@ -49,6 +49,7 @@ public final class ScriptParser {
         add("lasso add|remove X,Y X,Y X,Y...", ScriptParser::lasso);
         addWhole("invert", SelectionSession::invert);
         addWhole("reset", SelectionSession::reset);
+        add("select [ROW:FIRST-LAST[,FIRST-LAST]...]...", ScriptParser::select);
         addWhole("update-box", SelectionSession::updateBox);
         add("view FILE WIDTH HEIGHT SCALE OFFSETX OFFSETY [COLOUR COLOUR]", this::view);
         addPicture("colour-on-grey", Drawings::colourOnGrey);
@@ -161,6 +162,12 @@ public final class ScriptParser {
         List<Point> corners = new ArrayList<>();
         while (corners.size() < 3 || words.hasNext()) corners.add(words.takePoint());
         return new Command.Lasso(words.line(), mode, List.copyOf(corners));
+    }
+
+    private static Command select(Words words) throws ScriptException {
+        SelectedRuns runs = new SelectedRuns();
+        while (words.hasNext()) words.takeRow(runs);
+        return new Command.Select(words.line(), runs);
     }
 
     private Command view(Words words) throws ScriptException {

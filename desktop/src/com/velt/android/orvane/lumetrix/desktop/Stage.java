@@ -18,7 +18,7 @@ public interface Stage {
      *
      * @param line the command's line in the script
      * @param what the command
-     * @param where its first and last point and how many there are; may be empty
+     * @param where its first and last point and how many there are, or how many rows; may be empty
      * @param changed the rectangle that it changed
      */
     void done(int line, String what, String where, Area changed);

@@ -14,6 +14,8 @@ final class Words {
     private static final Pattern INTEGER = Pattern.compile("-?[0-9]{1,9}");
     private static final Pattern DECIMAL = Pattern.compile("[0-9]{1,5}(\\.[0-9]{1,9})?");
     private static final Pattern POINT = Pattern.compile("(-?[0-9]{1,9}),(-?[0-9]{1,9})");
+    private static final Pattern ROW = Pattern.compile("[0-9]{1,9}");
+    private static final Pattern RUN = Pattern.compile("([0-9]{1,9})-([0-9]{1,9})");
     private static final Pattern COLOUR = Pattern.compile("[0-9A-Fa-f]{8}");
 
     private final int line;
@@ -90,6 +92,43 @@ final class Words {
             throw new ScriptException(line, quote(word) + " is no point", expected);
         }
         return new Point(Integer.parseInt(point.group(1)), Integer.parseInt(point.group(2)));
+    }
+
+    /** Takes the runs of one row and adds them to those of the rows above it. */
+    void takeRow(SelectedRuns runs) throws ScriptException {
+        String form = "ROW:FIRST-LAST[,FIRST-LAST]... such as 12:5-9,14-20";
+        String word = take(form);
+        int colon = word.indexOf(':');
+        if (colon < 0 || !ROW.matcher(word.substring(0, colon)).matches()) {
+            throw new ScriptException(line, quote(word) + " is no row of runs", form);
+        }
+        int row = Integer.parseInt(word.substring(0, colon));
+        if (row <= runs.lastRow()) {
+            throw new ScriptException(line, "row " + row + " comes after row " + runs.lastRow(),
+                    "each row once, from top to bottom");
+        }
+        for (String run : word.substring(colon + 1).split(",", -1)) addRun(run, row, runs);
+    }
+
+    private void addRun(String run, int row, SelectedRuns runs) throws ScriptException {
+        Matcher columns = RUN.matcher(run);
+        if (!columns.matches()) {
+            throw new ScriptException(line, quote(run) + " is no run of row " + row,
+                    "its first and last column FIRST-LAST such as 5-9");
+        }
+        int first = Integer.parseInt(columns.group(1));
+        int last = Integer.parseInt(columns.group(2));
+        if (first > last) {
+            throw new ScriptException(line, "the run " + run + " of row " + row
+                    + " ends before it begins", "its first column and then its last");
+        }
+        boolean behind = row != runs.lastRow() || first > runs.last(runs.count() - 1);
+        if (!behind) {
+            throw new ScriptException(line, "the run " + run + " of row " + row
+                    + " begins at or before column " + runs.last(runs.count() - 1)
+                    + ", where the run before it ends", "runs from left to right");
+        }
+        runs.add(row, first, last);
     }
 
     int takeColour() throws ScriptException {

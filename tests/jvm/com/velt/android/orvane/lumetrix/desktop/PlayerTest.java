@@ -126,6 +126,15 @@ class PlayerTest {
     }
 
     @Test
+    void rowOfATakenSelectionSaysHowManyRowsItHas() throws IOException {
+        PlayerRun run = play("photo photo.png", "select 12:5-9,14-20 13:5-5 29:0-39",
+                "select 12:5-9", "select");
+        assertEquals(List.of("2 select (3 rows) 0..39 x 12..29 53 0..39 x 12..29",
+                "3 select (1 row) 0..39 x 12..29 5 5..9 x 12..12",
+                "4 select (0 rows) 5..9 x 12..12 0 none"), squeezed(run.out().subList(1, 4)));
+    }
+
+    @Test
     void scriptWithoutStrokesPrintsOnlyTheDigest() throws IOException {
         PlayerRun run = play("photo photo.png");
         assertEquals(1, run.out().size());
@@ -253,7 +262,8 @@ class PlayerTest {
     @Test
     void brokenScriptIsRefusedBeforeTheFirstStroke() throws IOException {
         assertRefused(4, "\"grwo\" is no command, expected photo, brush, fill, grow, shrink, paint,"
-                + " erase, lasso, invert, reset, update-box, view, colour-on-grey, reverse, mask",
+                + " erase, lasso, invert, reset, select, update-box,"
+                + " view, colour-on-grey, reverse, mask",
                 play("photo photo.png", "grow 5,5", "mask m.png", "grwo 5,5"));
     }
 
@@ -263,6 +273,15 @@ class PlayerTest {
     void pointOutsideThePhotoIsRefusedBeforeTheFirstStroke(String line, String point)
             throws IOException {
         assertRefused(4, "the point " + point + " lies outside the photo, expected 0,0 to 39,29",
+                play("photo photo.png", "grow 5,5", "mask m.png", line));
+    }
+
+    @ParameterizedTest
+    @CsvSource({"'select 0:0-40', 0-40, 0", "'select 0:0-39 30:5-5', 5-5, 30"})
+    void runBeyondThePhotoIsRefusedBeforeTheFirstStroke(String line, String run, String row)
+            throws IOException {
+        assertRefused(4, "the run " + run + " of row " + row + " reaches beyond the photo, expected"
+                + " rows 0 to 29 and columns 0 to 39",
                 play("photo photo.png", "grow 5,5", "mask m.png", line));
     }
 

@@ -14,6 +14,7 @@ import java.io.IOException;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.Arrays;
 import java.util.List;
 import java.util.Random;
 import java.util.function.Function;
@@ -41,6 +42,7 @@ class RecordedScriptTest {
 
     @Test
     void scriptsOfRandomSessionsReplayExactly() throws IOException, ScriptException {
+        int withSelect = 0;
         for (int seed = 0; seed < SESSIONS; ++seed) {
             Random random = new Random(seed);
             int[] photo = RandomStrokes.photo(random);
@@ -59,7 +61,9 @@ class RecordedScriptTest {
                 assertEquals(end, End.of(session), tried);
                 assertEquals(script, session.script("photo.png"), tried);
             }
+            if (script.contains("\nselect ")) ++withSelect;
         }
+        assertTrue(withSelect > SESSIONS / 4, withSelect + " scripts take over a selection");
     }
 
     @Test
@@ -126,6 +130,22 @@ class RecordedScriptTest {
                     session.script("p.png"));
             session.redo();
             assertEquals(all + "brush 2 1\n", session.script("p.png"));
+        }
+    }
+
+    @Test
+    void selectionTakenOverIsOneLineWithAWordARow() {
+        try (SelectionSession session = open(new int[WIDTH * HEIGHT], 100_000)) {
+            byte[] selection = new byte[WIDTH * HEIGHT];
+            Arrays.fill(selection, 12 * WIDTH + 5, 12 * WIDTH + 10, (byte) 1);
+            Arrays.fill(selection, 12 * WIDTH + 14, 12 * WIDTH + 24, (byte) 1);
+            Arrays.fill(selection, 13 * WIDTH, 13 * WIDTH + 1, (byte) 1);
+            session.select(selection);
+            session.select(new byte[WIDTH * HEIGHT]);
+            String one = "photo \"p.png\"\nselect 12:5-9,14-23 13:0-0\n";
+            assertEquals(one + "select\n", session.script("p.png"));
+            session.undo();
+            assertEquals(one + "brush 10 1\n", session.script("p.png"));
         }
     }
 

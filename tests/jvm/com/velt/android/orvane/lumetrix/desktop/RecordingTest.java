@@ -31,6 +31,7 @@ class RecordingTest {
     private static final int UPDATE_BOX = 6;
     private static final int DIGEST = 7;
     private static final int DESTROY = 8;
+    private static final int SELECT = 9;
 
     @TempDir
     private Path folder;
@@ -48,7 +49,8 @@ class RecordingTest {
     void recordingHoldsThePhotoAndEachCall() throws IOException {
         PlayerRun run = record("photo photo.png", "brush 4 2", "grow 1,1 to 2,0", "fill off",
                 "shrink 1,1", "erase 2,1", "fill on", "paint 0,1", "lasso add 0,0 2,0 2,1",
-                "lasso remove 0,1 1,1 1,0", "invert", "reset", "update-box");
+                "lasso remove 0,1 1,1 1,0", "invert", "reset", "update-box",
+                "select 0:0-0,2-2 1:1-2", "select");
         assertEquals(List.of(), run.err());
         assertEquals(0, run.status());
 
@@ -63,7 +65,8 @@ class RecordingTest {
             {MODIFY, 1, 0, 1, 1, 1, 1}, {MODIFY, 3, 0, 2, 1, 2, 1}, {MODIFY, 2, 1, 0, 1, 0, 1},
             {MODIFY, 4, 0, 0, 0, 2, 0}, {MODIFY, 4, 0, 2, 0, 2, 1}, {MODIFY, 4, 1, 2, 1, 0, 0},
             {MODIFY, 5, 0, 0, 1, 1, 1}, {MODIFY, 5, 0, 1, 1, 1, 0}, {MODIFY, 5, 1, 1, 0, 0, 1},
-            {INVERT}, {RESET}, {UPDATE_BOX}, {DIGEST}, {DESTROY}};
+            {INVERT}, {RESET}, {UPDATE_BOX}, {SELECT, 3, 0, 0, 0, 0, 2, 2, 1, 1, 2}, {SELECT, 0},
+            {DIGEST}, {DESTROY}};
         for (int[] call : calls) {
             numbers.writeByte(call[0]);
             for (int i = 1; i < call.length; ++i) numbers.writeInt(call[i]);

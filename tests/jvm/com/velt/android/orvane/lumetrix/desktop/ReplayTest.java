@@ -20,7 +20,7 @@ class ReplayTest {
     private Path folder;
 
     @ParameterizedTest
-    @ValueSource(strings = {"fig", "dandelion", "lasso", "torture"})
+    @ValueSource(strings = {"fig", "dandelion", "lasso", "select", "torture"})
     void scriptEndsWithItsDigest(String name)
             throws IOException, ScriptException, InterruptedException {
         String expected = Files.readString(DESKTOP.resolve("scripts/" + name + ".digest")).strip();
@@ -36,7 +36,7 @@ class ReplayTest {
     @Test
     void everyScriptIsReplayed() throws IOException {
         try (Stream<Path> files = Files.list(DESKTOP.resolve("scripts"))) {
-            assertEquals(List.of("dandelion", "fig", "lasso", "torture"),
+            assertEquals(List.of("dandelion", "fig", "lasso", "select", "torture"),
                     files.map(file -> file.getFileName().toString())
                             .filter(file -> file.endsWith(".strokes"))
                             .map(file -> file.replace(".strokes", "")).sorted().toList());

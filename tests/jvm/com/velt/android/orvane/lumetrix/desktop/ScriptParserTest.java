@@ -79,6 +79,31 @@ class ScriptParserTest {
         assertEquals(word, ((Command.Whole) command(word)).what());
     }
 
+    @Test
+    void selections() throws ScriptException {
+        SelectedRuns runs = new SelectedRuns();
+        assertEquals(new Command.Select(2, runs), command("select"));
+        runs.add(0, 0, 0);
+        runs.add(12, 5, 9);
+        runs.add(12, 14, 20);
+        assertEquals(new Command.Select(2, runs), command("select 0:0-0 12:5-9,14-20"));
+        runs.add(12, 21, 21);
+        runs.add(999999999, 3, 999999999);
+        assertEquals(new Command.Select(2, runs),
+                command("select 0:0-0 12:5-9,14-20,21-21 999999999:3-999999999"));
+    }
+
+    @Test
+    void selectionOfManyRunsIsReadToItsEnd() throws ScriptException {
+        StringBuilder line = new StringBuilder("select 0:0-0");
+        for (int x = 2; x < 400_000; x += 2) line.append(',').append(x).append('-').append(x);
+        for (int y = 1; y < 100_000; ++y) line.append(' ').append(y).append(":7-8");
+        SelectedRuns runs = ((Command.Select) command(line.toString())).runs();
+        assertEquals(200_000 + 99_999, runs.count());
+        assertEquals(100_000, runs.rows());
+        assertEquals(99_999, runs.lastRow());
+    }
+
     @ParameterizedTest
     @CsvSource({"view p.png 10 20 0.5 -3 4", "view p.png 10 20 1 0 0 FFFF0000 ff00ff00",
             "colour-on-grey p.png", "reverse p.png", "mask p.png"})
@@ -95,15 +120,15 @@ class ScriptParserTest {
 
     @Test
     void everyCommandHasAUsage() {
-        assertEquals(15, ScriptParser.usages().size());
+        assertEquals(16, ScriptParser.usages().size());
         assertTrue(ScriptParser.usages().contains("brush RADIUS CORE"));
     }
 
     @ParameterizedTest
     @CsvSource(delimiter = '|', quoteCharacter = '`', value = {
         "grwo 1,2          | `\"grwo\" is no command, expected photo, brush, fill, grow, shrink,"
-                + " paint, erase, lasso, invert, reset, update-box, view, colour-on-grey, reverse,"
-                + " mask`",
+                + " paint, erase, lasso, invert, reset, select, update-box, view, colour-on-grey,"
+                + " reverse, mask`",
         "photo b.png       | a second photo, expected one photo a script",
         "brush             | `the line ends too early, expected the brush's radius, a whole number"
                 + " from 0 to 500`",
@@ -136,6 +161,38 @@ class ScriptParserTest {
         "lasso add 1,2 3,4 | `the line ends too early, expected a point X,Y such as 120,45`",
         "lasso add 1,2 to 3,4 | `\"to\" is no point, expected a point X,Y such as 120,45`",
         "invert now        | `\"now\" is one word too many, expected invert`",
+        "select 12         | `\"12\" is no row of runs, expected ROW:FIRST-LAST[,FIRST-LAST]..."
+                + " such as 12:5-9,14-20`",
+        "select 1:2-3 x:5-9 | `\"x:5-9\" is no row of runs, expected ROW:FIRST-LAST"
+                + "[,FIRST-LAST]... such as 12:5-9,14-20`",
+        "select -1:5-9     | `\"-1:5-9\" is no row of runs, expected ROW:FIRST-LAST"
+                + "[,FIRST-LAST]... such as 12:5-9,14-20`",
+        "select 9999999999:5-9 | `\"9999999999:5-9\" is no row of runs, expected ROW:FIRST-LAST"
+                + "[,FIRST-LAST]... such as 12:5-9,14-20`",
+        "select 12:        | `\"\" is no run of row 12, expected its first and last column"
+                + " FIRST-LAST such as 5-9`",
+        "select 12:5       | `\"5\" is no run of row 12, expected its first and last column"
+                + " FIRST-LAST such as 5-9`",
+        "select 12:5-9,    | `\"\" is no run of row 12, expected its first and last column"
+                + " FIRST-LAST such as 5-9`",
+        "select 12:5-9,,14-20 | `\"\" is no run of row 12, expected its first and last column"
+                + " FIRST-LAST such as 5-9`",
+        "select 12:5--9    | `\"5--9\" is no run of row 12, expected its first and last column"
+                + " FIRST-LAST such as 5-9`",
+        "select 12:5-9:14-20 | `\"5-9:14-20\" is no run of row 12, expected its first and last"
+                + " column FIRST-LAST such as 5-9`",
+        "select 12:5-9999999999 | `\"5-9999999999\" is no run of row 12, expected its first and"
+                + " last column FIRST-LAST such as 5-9`",
+        "select 12:9-5     | `the run 9-5 of row 12 ends before it begins, expected its first"
+                + " column and then its last`",
+        "select 12:14-20,5-9 | `the run 5-9 of row 12 begins at or before column 20, where the run"
+                + " before it ends, expected runs from left to right`",
+        "select 12:5-9,9-20 | `the run 9-20 of row 12 begins at or before column 9, where the run"
+                + " before it ends, expected runs from left to right`",
+        "select 12:5-9 12:14-20 | `row 12 comes after row 12, expected each row once, from top to"
+                + " bottom`",
+        "select 13:5-9 12:5-9 | `row 12 comes after row 13, expected each row once, from top to"
+                + " bottom`",
         "mask              | `the line ends too early, expected a picture's file name such as"
                 + " view.png, without a folder`",
         "mask ../a.png     | `\"../a.png\" is no picture name, expected a picture's file name such"

@@ -22,6 +22,10 @@ public final class RandomStrokes {
         boolean isRedo() {
             return what.equals("redo");
         }
+
+        boolean isSelect() {
+            return what.startsWith("select ");
+        }
     }
 
     /** Mask and object box, the box as the library holds it. */
@@ -72,6 +76,7 @@ public final class RandomStrokes {
         if (die < 64) return new Deed("invert", session.invert());
         if (die < 66) return new Deed("reset", session.reset());
         if (die < 69) return new Deed("update-box", session.updateBox());
+        if (die < 72) return select();
         if (die < 75) return setBrush();
         if (die < 80) return setFill();
         if (die < 91) return session.canUndo() ? new Deed("undo", session.undo()) : setBrush();
@@ -90,6 +95,24 @@ public final class RandomStrokes {
     private Deed lasso(Mode mode) {
         int[] corners = points(3 + random.nextInt(3));
         return new Deed(mode + " " + Arrays.toString(corners), session.lasso(mode, corners));
+    }
+
+    /** Takes over what is selected, a rectangle, or noise. */
+    private Deed select() {
+        byte[] selection = session.mask();
+        int kind = random.nextInt(4);
+        if (kind > 0) Arrays.fill(selection, (byte) 0);
+        if (kind == 1) {
+            int[] corners = points(2);
+            for (int y = corners[1]; y <= corners[3]; ++y) {
+                for (int x = corners[0]; x <= corners[2]; ++x) selection[y * WIDTH + x] = 1;
+            }
+        }
+        if (kind > 1) {
+            int values = 1 + random.nextInt(6);
+            for (int i = 0; i < selection.length; ++i) selection[i] = (byte) random.nextInt(values);
+        }
+        return new Deed("select " + Arrays.toString(selection), session.select(selection));
     }
 
     private Deed setBrush() {

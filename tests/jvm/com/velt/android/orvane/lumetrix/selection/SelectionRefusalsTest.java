@@ -121,6 +121,11 @@ class SelectionRefusalsTest {
                         s -> s.copyMask(null)),
                 new Refusal(ARGUMENT, "the array for the mask has 47 elements, expected 8 x 6 = 48",
                         s -> s.copyMask(new byte[SIZE - 1])),
+                new Refusal(NULL, "the selection is null, expected one", s -> s.select(null)),
+                new Refusal(ARGUMENT, "the selection has 47 elements, expected 8 x 6 = 48",
+                        s -> s.select(new byte[SIZE - 1])),
+                new Refusal(ARGUMENT, "the selection has 49 elements, expected 8 x 6 = 48",
+                        s -> s.select(new byte[SIZE + 1])),
                 new Refusal(INDEX, "the point 8,0" + outside, s -> s.isSelected(8, 0)),
                 new Refusal(INDEX, "the point 0,-1" + outside, s -> s.isSelected(0, -1)),
                 new Refusal(NULL, "the name of the photo's file is null, expected one",
@@ -235,7 +240,7 @@ class SelectionRefusalsTest {
                     refusal(IllegalStateException.class, method), method.getName());
             ++refused;
         }
-        assertEquals(11, refused);
+        assertEquals(12, refused);
         assertFalse(session.canUndo());
         assertFalse(session.canRedo());
         IndexOutOfBoundsException e = assertThrows(INDEX, () -> session.dab(8, 0));

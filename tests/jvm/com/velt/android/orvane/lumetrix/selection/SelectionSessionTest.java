@@ -6,6 +6,7 @@ import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertNotEquals;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import android.graphics.Rect;
 import com.velt.android.orvane.lumetrix.MaskDrawing;
 import java.util.ArrayList;
 import java.util.Arrays;
@@ -193,6 +194,145 @@ class SelectionSessionTest {
     }
 
     @Test
+    void selectTakesOverOnesAndNothingElse() {
+        byte[] selection = new byte[WIDTH * HEIGHT];
+        byte[] others = {0, 2, 3, 4, 5, 6, 127, -1, -128, 17};
+        System.arraycopy(others, 0, selection, WIDTH, others.length);
+        selection[0] = 1;
+        selection[7] = 1;
+        selection[8] = 1;
+        selection[28] = 1;
+        byte[] given = selection.clone();
+        session.invert();
+        session.select(selection);
+        assertMask("""
+            #......#
+            #.......
+            ........
+            ....#...
+            ........
+            ........""");
+        assertArrayEquals(given, selection);
+    }
+
+    @Test
+    void selectReturnsJustWhatHasChanged() {
+        session.select(cells("""
+            ........
+            .###....
+            ........
+            ........
+            ........
+            ........"""));
+        Area changed = session.select(cells("""
+            ........
+            .##.....
+            ........
+            .....##.
+            ........
+            ........"""));
+        assertEquals(new Area(3, 1, 6, 3), changed);
+        assertEquals(new Area(1, 1, 6, 3), session.select(new byte[WIDTH * HEIGHT]));
+    }
+
+    @Test
+    void selectTakesOpenOutlinesAway() {
+        session.setFill(false);
+        session.lasso(Mode.LASSO_ADD, TRIANGLE);
+        session.lasso(Mode.LASSO_REMOVE, 6, 0, 7, 0, 7, 5);
+        String ring = """
+            ........
+            ..####..
+            ...#.#..
+            ....##..
+            .....#..
+            ........""";
+        assertNotEquals(0, countOf(3));
+        assertNotEquals(0, countOf(5));
+        assertEquals(new Area(2, 0, 7, 5), session.select(cells(ring)));
+        assertMask(ring);
+    }
+
+    @Test
+    void selectMakesTheObjectBoxTight() {
+        session.setBrush(1, 1);
+        session.brush(Mode.PAINT, 1, 1);
+        session.select(cells("""
+            ........
+            ........
+            ........
+            ....#...
+            ......#.
+            ........"""));
+        assertEquals(new Area(4, 3, 6, 4), session.objectBox());
+        byte[] corners = new byte[WIDTH * HEIGHT];
+        corners[0] = 1;
+        corners[corners.length - 1] = 1;
+        session.select(corners);
+        assertEquals(WHOLE, session.objectBox());
+    }
+
+    @Test
+    void selectingNothingLeavesTheEmptyBoxOfUpdating() {
+        session.invert();
+        assertEquals(WHOLE, session.select(new byte[WIDTH * HEIGHT]));
+        assertEquals(0, session.selectedPixels());
+        assertEquals(Area.EMPTY, session.objectBox());
+        assertEquals(new Rect(WIDTH, HEIGHT, 0, 0), RandomStrokes.State.of(session).box());
+    }
+
+    @Test
+    void selectedArrayIsNotKept() {
+        byte[] selection = new byte[WIDTH * HEIGHT];
+        Arrays.fill(selection, 9, 12, (byte) 1);
+        session.select(selection);
+        Arrays.fill(selection, (byte) 1);
+        session.invert();
+        session.undo();
+        assertMask("""
+            ........
+            .###....
+            ........
+            ........
+            ........
+            ........""");
+    }
+
+    @Test
+    void strokesGoOnFromWhatWasTakenOver() {
+        session.select(cells("""
+            .....###
+            .....#.#
+            .....###
+            ........
+            ........
+            ........"""));
+        session.setBrush(1, 1);
+        session.brush(Mode.PAINT, 1, 4);  // far away, with filling
+        assertMask("""
+            .....###
+            .....###
+            .....###
+            ##......
+            ##......
+            ........""");
+    }
+
+    @Test
+    void selectIsOneCallWithTheRunsOfEachRow() {
+        session.select(cells("""
+            #......#
+            ########
+            ........
+            .##.###.
+            ........
+            #......."""));
+        session.select(new byte[WIDTH * HEIGHT]);
+        assertEquals(List.of("SELECT [0, 0, 0, 0, 7, 7, 1, 0, 7, 3, 1, 2, 3, 4, 6, 5, 0, 0]",
+                "SELECT []"), calls.subList(2, calls.size()));
+    }
+
+    @Test
     void maskIsACopy() {
         session.invert();
         byte[] copy = session.mask();
@@ -232,7 +372,15 @@ class SelectionSessionTest {
             assertEquals(0, one.selectedPixels());
             one.undo();
             assertTrue(one.isSelected(0, 0));
+            one.select(new byte[] {2});
+            assertEquals(0, one.selectedPixels());
+            one.select(new byte[] {1});
+            assertTrue(one.isSelected(0, 0));
         }
+    }
+
+    private static byte[] cells(String drawing) {
+        return MaskDrawing.of(drawing).cells();
     }
 
     private int countOf(int value) {

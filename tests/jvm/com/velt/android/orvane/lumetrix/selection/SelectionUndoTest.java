@@ -7,6 +7,7 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 import com.velt.android.orvane.lumetrix.selection.RandomStrokes.Deed;
 import com.velt.android.orvane.lumetrix.selection.RandomStrokes.State;
 import java.util.ArrayList;
+import java.util.Arrays;
 import java.util.List;
 import java.util.Random;
 import org.junit.jupiter.api.Test;
@@ -25,6 +26,7 @@ class SelectionUndoTest {
         int undone = 0;
         int redone = 0;
         int passedOver = 0;
+        int selected = 0;
         for (int seed = 0; seed < SESSIONS; ++seed) {
             Random random = new Random(seed);
             photo = RandomStrokes.photo(random);
@@ -39,12 +41,14 @@ class SelectionUndoTest {
                     assertEquals(model.at < model.states.size() - 1, session.canRedo(), where);
                     if (deed.isUndo()) ++undone;
                     if (deed.isRedo()) ++redone;
+                    if (deed.isSelect()) ++selected;
                 }
                 passedOver += model.strokesWithoutEffectBeforeRedo;
             }
         }
-        assertTrue(undone > 1000 && redone > 300 && passedOver > 30,
-                undone + " undone, " + redone + " redone, " + passedOver + " passed over");
+        assertTrue(undone > 1000 && redone > 300 && passedOver > 30 && selected > 300,
+                undone + " undone, " + redone + " redone, " + passedOver + " passed over, "
+                        + selected + " selected");
     }
 
     @Test
@@ -205,6 +209,76 @@ class SelectionUndoTest {
         }
     }
 
+    @Test
+    void selectIsAStepOfMaskAndBox() {
+        try (SelectionSession session = open(SelectionSession.DEFAULT_HISTORY_BYTES)) {
+            session.setBrush(2, 1);
+            session.setFill(false);
+            session.brush(Mode.PAINT, 5, 5);
+            session.brush(Mode.ERASE, 4, 4);  // the box outgrows what is selected
+            session.lasso(Mode.LASSO_REMOVE, 8, 2, 14, 2, 14, 9);
+            State before = State.of(session);
+            Area changed = session.select(bar(1, 16, 20));
+            State after = State.of(session);
+            assertEquals(changed, session.undo());
+            assertEquals(before, State.of(session));
+            assertEquals(changed, session.redo());
+            assertEquals(after, State.of(session));
+            session.select(new byte[WIDTH * HEIGHT]);
+            session.undo();
+            assertEquals(after, State.of(session));
+        }
+    }
+
+    @Test
+    void selectionThatIsThereAlreadyIsNoStep() {
+        try (SelectionSession session = open(SelectionSession.DEFAULT_HISTORY_BYTES)) {
+            session.select(bar(3, 4, 9));
+            session.invert();
+            session.undo();
+            String script = session.script("p.png");
+            assertEquals(Area.EMPTY, session.select(bar(3, 4, 9)));
+            assertEquals(script, session.script("p.png"));
+            session.redo();
+            assertFalse(session.isSelected(4, 3));
+            session.undo();
+            session.undo();
+            assertFalse(session.canUndo());
+        }
+    }
+
+    @Test
+    void selectionThatIsThereAlreadyInAnOutgrownBoxIsAStepOfTheBox() {
+        try (SelectionSession session = open(SelectionSession.DEFAULT_HISTORY_BYTES)) {
+            session.setBrush(1, 1);
+            session.brush(Mode.PAINT, 1, 1, 6, 3);
+            session.brush(Mode.ERASE, 1, 1);
+            assertEquals(Area.EMPTY, session.select(session.mask()));
+            assertEquals(new Area(5, 2, 6, 3), session.objectBox());
+            assertEquals(Area.EMPTY, session.undo());
+            assertEquals(new Area(0, 0, 6, 3), session.objectBox());
+        }
+    }
+
+    /** A session begins with the library's other empty box. */
+    @Test
+    void selectingNothingAtTheBeginningIsAStepOnce() {
+        try (SelectionSession session = open(SelectionSession.DEFAULT_HISTORY_BYTES)) {
+            assertEquals(Area.EMPTY, session.select(new byte[WIDTH * HEIGHT]));
+            assertTrue(session.canUndo());
+            session.select(new byte[WIDTH * HEIGHT]);
+            session.undo();
+            assertFalse(session.canUndo());
+        }
+    }
+
+    /** Selects columns of one row. */
+    private static byte[] bar(int row, int first, int last) {
+        byte[] selection = new byte[WIDTH * HEIGHT];
+        Arrays.fill(selection, row * WIDTH + first, row * WIDTH + last + 1, (byte) 1);
+        return selection;
+    }
+
     private SelectionSession open(long historyBytes) {
         return new SelectionSession(photo, WIDTH, HEIGHT, historyBytes, CallListener.NONE);
     }
@@ -232,6 +306,7 @@ class SelectionUndoTest {
                 return;
             }
             assertEquals(deed.changed().union(difference), deed.changed(), where);
+            if (deed.isSelect()) assertEquals(difference, deed.changed(), where);
             if (now.equals(before)) {
                 if (at < states.size() - 1) ++strokesWithoutEffectBeforeRedo;
                 return;

@@ -1,0 +1,81 @@
+package com.velt.android.orvane.lumetrix.desktop.editing;
+
+import com.velt.android.orvane.lumetrix.desktop.Command;
+import com.velt.android.orvane.lumetrix.desktop.Photo;
+import com.velt.android.orvane.lumetrix.desktop.Picture;
+import com.velt.android.orvane.lumetrix.desktop.Script;
+import com.velt.android.orvane.lumetrix.desktop.ScriptException;
+import com.velt.android.orvane.lumetrix.desktop.ScriptParser;
+import java.io.IOException;
+import java.nio.file.Files;
+import java.nio.file.InvalidPathException;
+import java.nio.file.Path;
+
+/** Reads and writes stroke scripts together with their photos. */
+final class ScriptFile {
+    private ScriptFile() {}
+
+    /**
+     * A script that can be played.
+     *
+     * @param script its commands; their points lie on the photo
+     * @param photo its photo, as it is in its file
+     */
+    record Playable(Script script, OpenedPhoto photo) {}
+
+    /**
+     * Reads a script and its photo.
+     *
+     * @throws IOException when it cannot be played; the message says why, and in which line
+     */
+    static Playable read(Path file) throws IOException {
+        byte[] text = Files.readAllBytes(file);
+        try {
+            Script script = ScriptParser.parse(text);
+            OpenedPhoto photo = readPhoto(file, script);
+            for (Command command : script.commands()) command.check(photo.photo());
+            return new Playable(script, photo);
+        } catch (ScriptException e) {
+            throw new IOException(e.in(file.getFileName()), e);
+        }
+    }
+
+    private static OpenedPhoto readPhoto(Path file, Script script) throws IOException {
+        try {
+            return OpenedPhoto.readWhole(file.resolveSibling(script.photo()));
+        } catch (IOException | InvalidPathException e) {
+            throw new IOException("the photo \"" + script.photo() + "\" in line "
+                    + script.photoLine() + " cannot be read: " + Troubles.describe(e), e);
+        }
+    }
+
+    /**
+     * Returns the file that a script has to name: the photo's own, or a copy beside the script of
+     * a photo that is reduced, or whose file a script cannot name.
+     */
+    static Path photoOf(Path script, OpenedPhoto photo) {
+        String path = photo.file().toAbsolutePath().toString();
+        boolean nameable = path.indexOf('"') < 0 && path.indexOf('\n') < 0;
+        if (!photo.isReduced() && nameable) return photo.file();
+        String name = script.getFileName().toString().replaceFirst("\\.strokes$", "");
+        return script.resolveSibling(name.replaceAll("[\"\n]", "_") + "-photo.png");
+    }
+
+    /** Returns the name of a script's photo in the script. */
+    static String nameIn(Path script, Path photo) {
+        Path folder = script.toAbsolutePath().normalize().getParent();
+        Path file = photo.toAbsolutePath().normalize();
+        boolean oneTree = file.getRoot().equals(folder.getRoot());
+        return (oneTree ? folder.relativize(file) : file).toString();
+    }
+
+    /** Writes a script and, if its photo is a copy, that as well. */
+    static void write(Path file, String script, OpenedPhoto photo) throws IOException {
+        Path named = photoOf(file, photo);
+        if (!named.equals(photo.file())) {
+            Photo copy = photo.photo();
+            PictureFiles.write(named, new Picture(copy.width(), copy.height(), copy.pixels()));
+        }
+        PictureFiles.write(file, script);
+    }
+}
