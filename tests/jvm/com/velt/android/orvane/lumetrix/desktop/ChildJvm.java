@@ -14,9 +14,9 @@ import java.util.List;
 import java.util.Set;
 
 /** What a Java program of its own process printed, and how it ended. */
-record ChildJvm(int status, String out, String err) {
+public record ChildJvm(int status, String out, String err) {
     /** Runs a class with the classes under test, but without any option of this process. */
-    static ChildJvm run(Path scratch, Class<?> main, String... arguments)
+    public static ChildJvm run(Path scratch, Class<?> main, String... arguments)
             throws IOException, InterruptedException {
         Path out = scratch.resolve("child.out");
         Path err = scratch.resolve("child.err");

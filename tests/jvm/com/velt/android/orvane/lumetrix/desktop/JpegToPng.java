@@ -10,7 +10,7 @@ import javax.imageio.ImageIO;
  * <p>{@code -Xcheck:jni} warns about the JDK's own JPEG reader, so tests that run under it have
  * this program convert their photos in a process without it.
  */
-final class JpegToPng {
+public final class JpegToPng {
     private JpegToPng() {}
 
     /** Reads the file of the first argument and writes that of the second. */

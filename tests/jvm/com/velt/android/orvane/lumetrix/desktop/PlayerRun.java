@@ -7,8 +7,8 @@ import java.util.Arrays;
 import java.util.List;
 
 /** What the player printed, and its status. */
-record PlayerRun(int status, List<String> out, List<String> err) {
-    static PlayerRun of(Object... arguments) {
+public record PlayerRun(int status, List<String> out, List<String> err) {
+    public static PlayerRun of(Object... arguments) {
         ByteArrayOutputStream out = new ByteArrayOutputStream();
         ByteArrayOutputStream err = new ByteArrayOutputStream();
         List<String> words = Arrays.stream(arguments).map(Object::toString).toList();

@@ -12,15 +12,21 @@ final class Document implements AutoCloseable {
     final Strokes strokes;
     final Renderer renderer;
     int selectedPixels;
-    int steps;       // done, undone and redone
+    int steps;       // that did something, undone and redone ones included
     int stepsSaved;  // as many of them as there were when the selection was saved last
 
     /** {@code changed} is told where strokes have changed the selection, as soon as they have. */
     Document(OpenedPhoto photo, Consumer<Area> changed) {
         this.photo = photo;
         session = new SelectionSession(photo.photo().pixels(), photo.width(), photo.height());
-        strokes = new Strokes(session, changed);
-        renderer = new Renderer(session, photo.photo().pixels());
+        boolean made = false;
+        try {
+            strokes = new Strokes(session, changed);
+            renderer = new Renderer(session, photo.photo().pixels());
+            made = true;
+        } finally {
+            if (!made) session.close();  // memory is short; another photo can be opened still
+        }
     }
 
     /** Returns the photo with all that is not selected transparent. */

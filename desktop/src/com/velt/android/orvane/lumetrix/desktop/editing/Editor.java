@@ -22,7 +22,8 @@ import java.util.function.Supplier;
  *
  * <p>All methods return at once; what they ask for is done in their order by a thread of the
  * editor, files are read and written by another one. The listener is told of what comes of it.
- * Without a photo, and while a script is replayed, what would change the selection does nothing.
+ * Without a photo, and while a script is replayed, what would change the selection does nothing;
+ * nor does what is asked for after closing.
  *
  * <p>A process can have one editor, for the library has one selection.
  */
@@ -31,7 +32,7 @@ public final class Editor implements AutoCloseable {
     private static final long LONGEST_UNDRAWN = TimeUnit.SECONDS.toNanos(1) / 30;
 
     private final EditorListener listener;
-    private final Worker worker = new Worker("editor", this::failed);
+    private final Worker worker = new Worker("editor", this::drawWhenIdle, this::failed);
     private final FileThread files = new FileThread(this::busy, this::failed);
     private final Screen screen = new Screen();
 
@@ -80,8 +81,11 @@ public final class Editor implements AutoCloseable {
 
     private void begin(OpenedPhoto photo) {
         closeDocument();
-        document = new Document(photo, this::strokeChanged);
-        publish();
+        try {
+            document = new Document(photo, this::strokeChanged);
+        } finally {
+            publish();
+        }
     }
 
     private void closeDocument() {
@@ -96,7 +100,7 @@ public final class Editor implements AutoCloseable {
     /** Shows a photo that is open from now on like this. */
     public void show(OpenedPhoto photo, Placement placement, ViewKind kind) {
         wanted = new View(photo, placement, kind);
-        worker.add(this::drawWhenIdle);
+        worker.add(() -> {});  // it draws after each task
     }
 
     /**
@@ -120,6 +124,7 @@ public final class Editor implements AutoCloseable {
         });
     }
 
+    /** Is called after each task. */
     private void drawWhenIdle() {
         if (worker.isIdle() || System.nanoTime() - lastDrawn > LONGEST_UNDRAWN) draw();
     }
@@ -128,17 +133,19 @@ public final class Editor implements AutoCloseable {
         View view = wanted;
         if (document == null || view == null || view.photo() != document.photo) return;
         if (view == drawn && dirty.isEmpty()) return;
+        Area changed = dirty;
+        boolean sameView = view == drawn;
+        drawn = view;  // also when drawing fails, for it would fail again after each task
+        dirty = Area.EMPTY;
         long start = System.nanoTime();
-        if (view == drawn) {
-            screen.change(frame -> document.renderer.drawChange(frame, dirty, dashes));
+        if (sameView) {
+            screen.change(frame -> document.renderer.drawChange(frame, changed, dashes));
             changeNanos = System.nanoTime() - start;
         } else {
             screen.replace(view.placement(), view.kind(),
                     frame -> document.renderer.drawWhole(frame, dashes));
             redrawNanos = System.nanoTime() - start;
         }
-        drawn = view;
-        dirty = Area.EMPTY;
         lastDrawn = System.nanoTime();
         listener.frameDrawn();
     }
@@ -146,14 +153,17 @@ public final class Editor implements AutoCloseable {
     // Strokes
 
     /**
-     * Begins a stroke of a brush.
+     * Begins a stroke of a brush; one that is under way still ends before.
      *
      * @param mode grow, shrink, paint or erase
      * @param x column of its first dab; it may lie outside the photo
      * @param y row of its first dab
      */
     public void beginStroke(Mode mode, Brush brush, int x, int y) {
-        edit(() -> document.strokes.begin(mode, brush, x, y));
+        edit(() -> {
+            endStrokeUnderWay();
+            document.strokes.begin(mode, brush, x, y);
+        });
     }
 
     /** Leads a stroke that is begun to a point, which may lie outside the photo. */
@@ -165,11 +175,13 @@ public final class Editor implements AutoCloseable {
 
     /** Ends a stroke that is begun. */
     public void endStroke() {
-        edit(() -> {
-            if (!document.strokes.underWay()) return;
-            document.strokes.end();
-            strokeEnded();
-        });
+        edit(this::endStrokeUnderWay);
+    }
+
+    private void endStrokeUnderWay() {
+        if (!document.strokes.underWay()) return;
+        document.strokes.end();
+        strokeEnded(false);
     }
 
     /** Draws a lasso through corners; those outside the photo are moved to its border. */
@@ -182,7 +194,8 @@ public final class Editor implements AutoCloseable {
                 return;
             }
             document.strokes.lasso(mode, inside);
-            strokeEnded();
+            // An outline alone changes what it runs over; hardly ever is that what was meant.
+            strokeEnded(!document.session.fill());
         });
     }
 
@@ -197,10 +210,12 @@ public final class Editor implements AutoCloseable {
         if (System.nanoTime() - lastDrawn > LONGEST_UNDRAWN) draw();
     }
 
-    private void strokeEnded() {
+    /** Says why a stroke did nothing; {@code inVain} also when it did something. */
+    private void strokeEnded(boolean inVain) {
         int before = document.selectedPixels;
-        stepDone();
-        if (document.selectedPixels == before) say(Message.Kind.HINT, document.strokes.reason());
+        stepDone(document.strokes.dabs() > 0);
+        boolean nothing = document.selectedPixels == before;
+        if (nothing || inVain) say(Message.Kind.HINT, document.strokes.reason());
     }
 
     /** Inverts the selection. */
@@ -231,10 +246,10 @@ public final class Editor implements AutoCloseable {
         });
     }
 
-    /** Tells whether strokes fill holes, and erase what they cut off. */
+    /** Tells whether strokes fill holes, and erase what they cut off. Not during a stroke. */
     public void setFill(boolean on) {
         edit(() -> {
-            document.session.setFill(on);
+            if (!document.strokes.underWay()) document.session.setFill(on);
             publish();
         });
     }
@@ -242,23 +257,23 @@ public final class Editor implements AutoCloseable {
     private void step(Function<SelectionSession, Area> operation) {
         edit(() -> {
             if (document.strokes.underWay()) return;
-            dirty = dirty.union(operation.apply(document.session));
-            stepDone();
+            Area changed = operation.apply(document.session);
+            dirty = dirty.union(changed);
+            stepDone(!changed.isEmpty());
         });
     }
 
-    private void stepDone() {
+    /** Takes notice of a step, which may have done nothing. */
+    private void stepDone(boolean something) {
         document.selectedPixels = document.session.selectedPixels();
-        ++document.steps;
+        if (something) ++document.steps;
         publish();
     }
 
     private void edit(Runnable task) {
         if (refusedInReplay()) return;
         worker.add(() -> {
-            if (document == null) return;
-            task.run();
-            drawWhenIdle();
+            if (document != null) task.run();
         });
     }
 
@@ -270,16 +285,21 @@ public final class Editor implements AutoCloseable {
             OpenedPhoto photo = document.photo;
             files.run("Loading " + nameOf(file), nameOf(file) + " cannot be loaded", () -> {
                 byte[] mask = PictureFiles.readMask(file, photo.width(), photo.height());
-                worker.add(() -> select(photo, mask));
+                worker.add(() -> select(photo, mask, nameOf(file)));
             });
         });
     }
 
-    private void select(OpenedPhoto photo, byte[] mask) {
-        if (document == null || document.photo != photo || document.strokes.underWay()) return;
-        dirty = dirty.union(document.session.select(mask));
-        stepDone();
-        draw();
+    private void select(OpenedPhoto photo, byte[] mask, String name) {
+        if (document == null || document.photo != photo) return;
+        if (document.strokes.underWay()) {
+            say(Message.Kind.HINT, name + " is not loaded, for a stroke is under way. Load it"
+                    + " again.");
+            return;
+        }
+        Area changed = document.session.select(mask);
+        dirty = dirty.union(changed);
+        stepDone(!changed.isEmpty());
     }
 
     /** Saves the selection, white on black, as PNG. The result tells whether it is saved. */
@@ -315,7 +335,10 @@ public final class Editor implements AutoCloseable {
     public CompletableFuture<Boolean> saveView(Path file) {
         return save(file, () -> {
             List<Picture> seen = new ArrayList<>();
-            screen.look(frame -> seen.add(frame.seen()));
+            screen.look(frame -> {
+                if (!frame.placement().seen().isEmpty()) seen.add(frame.seen());
+            });
+            if (seen.isEmpty()) throw new IllegalStateException("nothing of the photo is seen");
             return () -> PictureFiles.write(file, seen.get(0));
         });
     }
@@ -347,16 +370,18 @@ public final class Editor implements AutoCloseable {
     }
 
     private FileThread.Job takeDown(Supplier<FileThread.Job> taking) {
-        boolean possible = document != null && drawn != null && !document.strokes.underWay();
+        if (document == null) return failing("no photo is open");
+        if (document.strokes.underWay()) return failing("a stroke is under way");
         try {
-            if (possible) return taking.get();
-        } catch (OutOfMemoryError e) {
-            return () -> {
-                throw e;
-            };
+            return taking.get();
+        } catch (RuntimeException | OutOfMemoryError e) {
+            return failing(Troubles.describe(e));
         }
+    }
+
+    private static FileThread.Job failing(String why) {
         return () -> {
-            throw new IOException("there is no photo, or a stroke is under way");
+            throw new IOException(why);
         };
     }
 
@@ -377,7 +402,9 @@ public final class Editor implements AutoCloseable {
         files.run("Reading " + nameOf(file), nameOf(file) + " cannot be played", () -> {
             ScriptFile.Playable playable = ScriptFile.read(file);
             worker.add(() -> play(playable, nameOf(file)));
-        }).thenAccept(read -> replaying &= read);
+        }).whenComplete((read, trouble) -> {
+            if (trouble != null || !read) replaying = false;  // else the end of the replay does it
+        });
     }
 
     /** Stops a replay; what it has done so far stays. */
@@ -386,25 +413,27 @@ public final class Editor implements AutoCloseable {
     }
 
     private void play(ScriptFile.Playable playable, String name) {
+        String result;
         try {
             begin(playable.photo());
             replay = new Replay(document.session, playable.script(), this::replayGoesOn);
             work = "Replaying " + name;
             boolean all = replay.play();
-            say(Message.Kind.DONE, all
+            result = all
                     ? "Replayed " + name + ", digest " + Digest.of(document.session) + "."
                     : "Stopped " + name + " after " + replay.performed() + " of "
-                            + replay.commands() + " commands.");
-            document.selectedPixels = document.session.selectedPixels();
+                            + replay.commands() + " commands.";
         } catch (IOException e) {
             throw new IllegalStateException("a replay writes no files", e);
         } finally {
             replaying = false;
             replay = null;
             work = "";
+            if (document != null) document.selectedPixels = document.session.selectedPixels();
             publish();
             drawAll();
         }
+        say(Message.Kind.DONE, result);
     }
 
     /** Is asked before each dab, and shows how far the replay has come. */
@@ -467,16 +496,18 @@ public final class Editor implements AutoCloseable {
     void settle() {
         for (int round = 0; round < 3; ++round) {  // files to worker to files
             files.run("", "", () -> {}).join();
-            CompletableFuture.runAsync(() -> {}, worker::add).join();
+            CompletableFuture.runAsync(this::draw, worker::add).join();
         }
     }
 
-    /** Stops a replay, finishes what is being saved, and ends the editor's threads. */
+    /**
+     * Stops a replay, finishes what is being saved, and ends the editor's threads. Waits for all of
+     * that, so the listener must not call it.
+     */
     @Override
     public void close() {
         replayStopped = true;
-        worker.add(this::closeDocument);
-        worker.close();
+        worker.close(this::closeDocument);
         files.close();
     }
 }

@@ -1,6 +1,10 @@
 package com.velt.android.orvane.lumetrix.desktop.editing;
 
-/** Is told what happens in an editor, in threads of the editor's own. */
+/**
+ * Is told what happens in an editor: in threads of the editor's own, and of what is refused at once
+ * in the thread that asked for it. It must not wait for another thread, which may be waiting for
+ * the editor to close.
+ */
 public interface EditorListener {
     /** There is a new frame to look at. */
     void frameDrawn();

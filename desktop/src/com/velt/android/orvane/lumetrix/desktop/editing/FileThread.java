@@ -4,6 +4,7 @@ import java.io.IOException;
 import java.util.concurrent.CompletableFuture;
 import java.util.concurrent.ExecutorService;
 import java.util.concurrent.Executors;
+import java.util.concurrent.RejectedExecutionException;
 import java.util.concurrent.TimeUnit;
 import java.util.function.Consumer;
 
@@ -35,21 +36,27 @@ final class FileThread implements AutoCloseable {
      *
      * @param what what is going on, such as {@code Opening fig.jpg}
      * @param failure what is to be said when it fails, up to the colon
-     * @return whether it was done
+     * @return whether it was done; after closing it never is
      */
     CompletableFuture<Boolean> run(String what, String failure, Job job) {
-        return CompletableFuture.supplyAsync(() -> {
-            busy.accept(what);
-            try {
-                job.run();
-                return true;
-            } catch (IOException | RuntimeException | OutOfMemoryError e) {
-                failed.accept(failure + ": " + Troubles.describe(e) + ".");
-                return false;
-            } finally {
-                busy.accept("");
-            }
-        }, executor);
+        try {
+            return CompletableFuture.supplyAsync(() -> isDone(what, failure, job), executor);
+        } catch (RejectedExecutionException e) {
+            return CompletableFuture.completedFuture(false);
+        }
+    }
+
+    private boolean isDone(String what, String failure, Job job) {
+        busy.accept(what);
+        try {
+            job.run();
+            return true;
+        } catch (IOException | RuntimeException | OutOfMemoryError e) {
+            failed.accept(failure + ": " + Troubles.describe(e) + ".");
+            return false;
+        } finally {
+            busy.accept("");
+        }
     }
 
     /** Ends the thread once its jobs are done, and waits for that. */

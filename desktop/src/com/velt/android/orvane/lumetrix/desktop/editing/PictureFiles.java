@@ -3,10 +3,13 @@ package com.velt.android.orvane.lumetrix.desktop.editing;
 import com.velt.android.orvane.lumetrix.desktop.Photo;
 import com.velt.android.orvane.lumetrix.desktop.Picture;
 import java.io.IOException;
+import java.io.OutputStream;
 import java.nio.file.Files;
 import java.nio.file.Path;
 import java.nio.file.StandardCopyOption;
 import javax.imageio.ImageIO;
+import javax.imageio.stream.ImageOutputStream;
+import javax.imageio.stream.MemoryCacheImageOutputStream;
 
 /** Reads masks, and writes files all or nothing: a write that fails leaves an older file alone. */
 final class PictureFiles {
@@ -15,8 +18,12 @@ final class PictureFiles {
     /** Writes a picture as PNG. */
     static void write(Path file, Picture picture) throws IOException {
         replace(file, temporary -> {
-            if (!ImageIO.write(picture.toImage(), "png", temporary.toFile())) {
-                throw new IOException("no PNG writer in this Java");
+            // By way of a stream of our own, which says why a file cannot be written.
+            try (OutputStream to = Files.newOutputStream(temporary);
+                    ImageOutputStream out = new MemoryCacheImageOutputStream(to)) {
+                if (!ImageIO.write(picture.toImage(), "png", out)) {
+                    throw new IOException("no PNG writer in this Java");
+                }
             }
         });
     }
@@ -57,7 +64,9 @@ final class PictureFiles {
                     + " pixels, the photo " + width + " x " + height);
         }
         byte[] mask = new byte[width * height];
-        for (int i = 0; i < mask.length; ++i) mask[i] = (byte) (isBright(picture.pixels()[i]) ? 1 : 0);
+        for (int i = 0; i < mask.length; ++i) {
+            if (isBright(picture.pixels()[i])) mask[i] = 1;
+        }
         return mask;
     }
 

@@ -57,16 +57,37 @@ final class ScriptFile {
         String path = photo.file().toAbsolutePath().toString();
         boolean nameable = path.indexOf('"') < 0 && path.indexOf('\n') < 0;
         if (!photo.isReduced() && nameable) return photo.file();
-        String name = script.getFileName().toString().replaceFirst("\\.strokes$", "");
-        return script.resolveSibling(name.replaceAll("[\"\n]", "_") + "-photo.png");
+        String name = script.getFileName().toString().replaceFirst("\\.strokes$", "")
+                .replaceAll("[\"\n]", "_");
+        Path copy = script.resolveSibling(name + "-photo.png");
+        // Never over the photo itself.
+        return isSame(copy, photo.file()) ? script.resolveSibling(name + "-photo-copy.png") : copy;
+    }
+
+    private static boolean isSame(Path one, Path other) {
+        try {
+            return Files.isSameFile(one, other);
+        } catch (IOException e) {
+            return false;  // there is nothing to overwrite
+        }
     }
 
     /** Returns the name of a script's photo in the script. */
     static String nameIn(Path script, Path photo) {
-        Path folder = script.toAbsolutePath().normalize().getParent();
-        Path file = photo.toAbsolutePath().normalize();
+        Path folder = real(script).getParent();
+        Path file = real(photo);
         boolean oneTree = file.getRoot().equals(folder.getRoot());
         return (oneTree ? folder.relativize(file) : file).toString();
+    }
+
+    /** Returns a path without links to folders: whoever follows {@code ..} follows none either. */
+    private static Path real(Path file) {
+        Path path = file.toAbsolutePath();
+        try {
+            return path.getParent().toRealPath().resolve(path.getFileName());
+        } catch (IOException e) {
+            return path.normalize();  // the folder is missing, so nothing will be written
+        }
     }
 
     /** Writes a script and, if its photo is a copy, that as well. */

@@ -6,15 +6,15 @@ import com.velt.android.orvane.lumetrix.selection.Viewport;
 /**
  * Zoom and pan: which part of a photo a window shows, and how large.
  *
- * <p>Positions in the window are in pixels of the screen. The photo's centre of view never leaves
- * the photo, so some of it can always be seen.
+ * <p>Positions in the window are in pixels of the screen. The middle of the window never leaves the
+ * photo, so some of it can always be seen.
  */
 public final class ViewModel {
     /** The smallest scale: 32 screen pixels a photo pixel. */
     public static final float SMALLEST_SCALE = 1f / 32;
 
     private static final float LARGEST_SCALE = 128;
-    private static final int MARGIN = 12;  // around a photo that fits
+    private static final int LARGEST_MARGIN = 12;  // around a photo that fits
 
     private int viewWidth = 1;
     private int viewHeight = 1;
@@ -58,10 +58,15 @@ public final class ViewModel {
     }
 
     private float fittingScale() {
-        double wide = photoWidth / (double) Math.max(1, viewWidth - 2 * MARGIN);
-        double high = photoHeight / (double) Math.max(1, viewHeight - 2 * MARGIN);
+        double wide = photoWidth / (double) withoutMargins(viewWidth);
+        double high = photoHeight / (double) withoutMargins(viewHeight);
         double exact = Math.max(wide, high);
         return limited(Math.ceil(exact * 65536) / 65536);
+    }
+
+    /** Small windows have small margins, or the photo would have no room. */
+    private static int withoutMargins(int view) {
+        return view - 2 * Math.min(LARGEST_MARGIN, view / 8);
     }
 
     private void centre() {
@@ -100,13 +105,16 @@ public final class ViewModel {
     }
 
     private void moveTo(double newLeft, double newTop) {
-        left = withCentreOnPhoto(newLeft, viewWidth * (double) scale, photoWidth);
-        top = withCentreOnPhoto(newTop, viewHeight * (double) scale, photoHeight);
+        left = withMiddleOnPhoto(newLeft, viewWidth, photoWidth);
+        top = withMiddleOnPhoto(newTop, viewHeight, photoHeight);
         fitted = false;
     }
 
-    private static double withCentreOnPhoto(double start, double shown, int photo) {
-        return Math.max(-shown / 2, Math.min(start, photo - 1 - shown / 2));
+    /** Keeps a whole screen pixel in the middle of the window on the photo, if it has the room. */
+    private double withMiddleOnPhoto(double start, int view, int photo) {
+        double shown = view * (double) scale;
+        double half = Math.min(scale, photo) / 2.0;
+        return Math.max(half - shown / 2, Math.min(start, photo - half - shown / 2));
     }
 
     /** Returns photo pixels per screen pixel. */
@@ -164,15 +172,23 @@ public final class ViewModel {
     private Line line(double start, int photo, int view, float rounding) {
         int from = (int) Math.max(-1, Math.ceil(-start / scale));
         int to = (int) Math.min(view, Math.ceil((photo - start) / scale) - 1);
+        if (from > to) {  // all of the photo lies between two screen pixels
+            from = (int) Math.floor((photo / 2.0 - start) / scale);
+            from = Math.max(0, Math.min(from, view - 1));
+            to = from;
+        }
         // Reduced, the drawing's offset is the finer of the two steps; enlarged, its place is.
         int place = from;
         int offset = (int) Math.round(start + from * (double) scale - rounding);
+        offset = Math.max(0, Math.min(offset, photo - 1));
         if (scale < 1) {
             offset = (int) Math.floor(start + from * (double) scale) - 1;
             place = (int) Math.round((offset + rounding - start) / scale);
         }
-        int first = from - place;
-        int last = Math.max(first, to - place);
+        // The drawing is up to half a pixel beside its place, so the photo may begin or end a pixel
+        // sooner or later.
+        int first = Math.max(0, Math.max(-1, from - 1) - place);
+        int last = Math.max(first, Math.min(view, to + 1) - place);
         while (first < last && Placement.sampled(offset, scale, rounding, first) < 0) ++first;
         while (first < last && Placement.sampled(offset, scale, rounding, last) >= photo) --last;
         return new Line(offset, place, first, last);

@@ -4,14 +4,25 @@ import java.util.concurrent.BlockingQueue;
 import java.util.concurrent.LinkedBlockingQueue;
 import java.util.function.Consumer;
 
-/** A thread that does tasks in their order. A task that fails is reported, and the next one done. */
-final class Worker implements AutoCloseable {
+/**
+ * A thread that does tasks in their order. A task that fails, however badly, is reported, and the
+ * next one done.
+ */
+final class Worker {
     private final BlockingQueue<Runnable> tasks = new LinkedBlockingQueue<>();
+    private final Runnable afterEach;
     private final Consumer<Throwable> failed;
     private final Thread thread;
     private boolean closing;  // read and written by the thread alone
 
-    Worker(String name, Consumer<Throwable> failed) {
+    /**
+     * Starts the thread.
+     *
+     * @param afterEach is done after each task, also one that has failed
+     * @param failed is told what went wrong
+     */
+    Worker(String name, Runnable afterEach, Consumer<Throwable> failed) {
+        this.afterEach = afterEach;
         this.failed = failed;
         thread = new Thread(this::work, name);
         thread.start();
@@ -20,12 +31,21 @@ final class Worker implements AutoCloseable {
     private void work() {
         while (!closing) {
             try {
-                tasks.take().run();
+                Runnable task = tasks.take();
+                attempt(task);
+                attempt(afterEach);
             } catch (InterruptedException e) {
                 throw new IllegalStateException("nobody interrupts this thread", e);
-            } catch (RuntimeException | OutOfMemoryError | UnsatisfiedLinkError e) {
-                failed.accept(e);
             }
+        }
+    }
+
+    /** Errors as well: memory may do for the next task, and without the thread all would stop. */
+    private void attempt(Runnable task) {
+        try {
+            task.run();
+        } catch (RuntimeException | Error e) {
+            failed.accept(e);
         }
     }
 
@@ -39,10 +59,12 @@ final class Worker implements AutoCloseable {
         return tasks.isEmpty();
     }
 
-    /** Ends the thread once it has done what waits, and waits for that. */
-    @Override
-    public void close() {
-        tasks.add(() -> closing = true);
+    /** Ends the thread once it has done what waits and, after it, a last task; waits for that. */
+    void close(Runnable last) {
+        tasks.add(() -> {
+            closing = true;
+            last.run();
+        });
         try {
             thread.join();
         } catch (InterruptedException e) {
