@@ -11,7 +11,8 @@ final class Document implements AutoCloseable {
     final SelectionSession session;
     final Strokes strokes;
     final Renderer renderer;
-    int selectedPixels;
+    int selectedPixels;  // as they were counted last
+    int selectedBefore;  // the last stroke
     int steps;       // that did something, undone and redone ones included
     int stepsSaved;  // as many of them as there were when the selection was saved last
 

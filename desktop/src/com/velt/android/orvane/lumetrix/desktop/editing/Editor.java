@@ -13,6 +13,7 @@ import java.util.ArrayList;
 import java.util.List;
 import java.util.concurrent.CompletableFuture;
 import java.util.concurrent.TimeUnit;
+import java.util.concurrent.atomic.AtomicLong;
 import java.util.function.Consumer;
 import java.util.function.Function;
 import java.util.function.Supplier;
@@ -31,6 +32,9 @@ public final class Editor implements AutoCloseable {
     /** The longest time without a redraw while there is more and more to draw, in nanoseconds. */
     private static final long LONGEST_UNDRAWN = TimeUnit.SECONDS.toNanos(1) / 30;
 
+    /** The longest time in a stroke without counting what is selected. */
+    private static final long LONGEST_UNCOUNTED = TimeUnit.SECONDS.toNanos(1) / 5;
+
     private final EditorListener listener;
     private final Worker worker = new Worker("editor", this::drawWhenIdle, this::failed);
     private final FileThread files = new FileThread(this::busy, this::failed);
@@ -39,6 +43,8 @@ public final class Editor implements AutoCloseable {
     private volatile View wanted;
     private volatile boolean replaying;
     private volatile boolean replayStopped;
+    private final AtomicLong strokesBegun = new AtomicLong();
+    private volatile long strokesCut;  // so many of those begun set no more dabs
 
     // The rest belongs to the worker's thread.
     private Document document;        // or null
@@ -46,6 +52,7 @@ public final class Editor implements AutoCloseable {
     private Area dirty = Area.EMPTY;  // where the photo may look otherwise than on the screen
     private int dashes;
     private long lastDrawn;
+    private long lastCounted;
     private long redrawNanos;
     private long changeNanos;
     private String work = "";         // what takes a while, or empty
@@ -67,7 +74,10 @@ public final class Editor implements AutoCloseable {
         files.run("Opening " + nameOf(file), nameOf(file) + " cannot be opened", () -> {
             OpenedPhoto photo = OpenedPhoto.read(file);
             worker.add(() -> {
+                boolean fill = document == null || document.session.fill();
                 begin(photo);
+                document.session.setFill(fill);
+                publish();
                 if (photo.isReduced()) say(Message.Kind.HINT, reduction(photo));
             });
         });
@@ -160,9 +170,11 @@ public final class Editor implements AutoCloseable {
      * @param y row of its first dab
      */
     public void beginStroke(Mode mode, Brush brush, int x, int y) {
+        long number = strokesBegun.incrementAndGet();
         edit(() -> {
             endStrokeUnderWay();
-            document.strokes.begin(mode, brush, x, y);
+            document.selectedBefore = document.selectedPixels;
+            document.strokes.begin(mode, brush, x, y, () -> number > strokesCut);
         });
     }
 
@@ -176,6 +188,12 @@ public final class Editor implements AutoCloseable {
     /** Ends a stroke that is begun. */
     public void endStroke() {
         edit(this::endStrokeUnderWay);
+    }
+
+    /** Ends a stroke that is begun where it is: what waits to be done of it is left out. */
+    public void cutStroke() {
+        strokesCut = strokesBegun.get();
+        endStroke();
     }
 
     private void endStrokeUnderWay() {
@@ -193,6 +211,7 @@ public final class Editor implements AutoCloseable {
                 say(Message.Kind.HINT, Hints.LASSO_TOO_SHORT);
                 return;
             }
+            document.selectedBefore = document.selectedPixels;
             document.strokes.lasso(mode, inside);
             // An outline alone changes what it runs over; hardly ever is that what was meant.
             strokeEnded(!document.session.fill());
@@ -208,13 +227,21 @@ public final class Editor implements AutoCloseable {
     private void strokeChanged(Area changed) {
         dirty = dirty.union(changed);
         if (System.nanoTime() - lastDrawn > LONGEST_UNDRAWN) draw();
+        if (System.nanoTime() - lastCounted > LONGEST_UNCOUNTED && document.strokes.underWay()) {
+            count();
+            publish();
+        }
+    }
+
+    private void count() {
+        document.selectedPixels = document.session.selectedPixels();
+        lastCounted = System.nanoTime();
     }
 
     /** Says why a stroke did nothing; {@code inVain} also when it did something. */
     private void strokeEnded(boolean inVain) {
-        int before = document.selectedPixels;
         stepDone(document.strokes.dabs() > 0);
-        boolean nothing = document.selectedPixels == before;
+        boolean nothing = document.selectedPixels == document.selectedBefore;
         if (nothing || inVain) say(Message.Kind.HINT, document.strokes.reason());
     }
 
@@ -265,7 +292,7 @@ public final class Editor implements AutoCloseable {
 
     /** Takes notice of a step, which may have done nothing. */
     private void stepDone(boolean something) {
-        document.selectedPixels = document.session.selectedPixels();
+        count();
         if (something) ++document.steps;
         publish();
     }
@@ -429,7 +456,7 @@ public final class Editor implements AutoCloseable {
             replaying = false;
             replay = null;
             work = "";
-            if (document != null) document.selectedPixels = document.session.selectedPixels();
+            if (document != null) count();
             publish();
             drawAll();
         }
@@ -501,12 +528,13 @@ public final class Editor implements AutoCloseable {
     }
 
     /**
-     * Stops a replay, finishes what is being saved, and ends the editor's threads. Waits for all of
+     * Stops a replay, cuts a stroke, finishes what is being saved, and ends the editor's threads. Waits for all of
      * that, so the listener must not call it.
      */
     @Override
     public void close() {
         replayStopped = true;
+        strokesCut = Long.MAX_VALUE;
         worker.close(this::closeDocument);
         files.close();
     }

@@ -9,12 +9,15 @@ import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 /**
  * Draws what is seen of a session's photo and selection, with the library's drawing methods.
  *
- * <p>{@link #drawWhole} draws the visible part of the photo as the app does. After a dab
- * {@link #drawChange} gives the same picture sooner: a virtual machine copies whole photos for each
- * drawing, so photo and mask are first sampled where the dab can be seen, and these small samples
- * are drawn.
+ * <p>{@link #drawDirectly} draws the visible part of the photo as the app does. Others give the same
+ * picture sooner: a virtual machine copies whole photos for each drawing, so {@link #drawChange}
+ * first samples photo and mask where a dab can be seen, and draws these small samples; and so does
+ * {@link #drawWhole} where the photo is large beside the view.
  */
 final class Renderer {
+    /** How many times the pixels of a view a photo has for samples to be drawn sooner; measured. */
+    private static final int LARGE = 2;
+
     private static final int DASH_PERIOD = 10;  // view pixels after which the dashes repeat
     private static final byte NEITHER_SELECTED_NOR_OUTSIDE = 2;
 
@@ -34,13 +37,24 @@ final class Renderer {
 
     /** Draws the visible part of the photo. {@code dashes} is 0 or 1: which colour comes first. */
     void drawWhole(Frame frame, int dashes) {
+        boolean direct = frame.kind() == ViewKind.OUTLINE || frame.kind() == ViewKind.PHOTO;
+        boolean large = photo.length > LARGE * frame.pixels().length;
+        if (direct && !large) {
+            drawDirectly(frame, dashes);
+        } else {
+            drawSamples(frame, frame.placement().part(), dashes);
+        }
+    }
+
+    /** Has the library draw from the whole photo: the definition of what its views look like. */
+    void drawDirectly(Frame frame, int dashes) {
         Placement placement = frame.placement();
         switch (frame.kind()) {
             case OUTLINE -> session.drawOutlinedView(frame.pixels(), placement.port(),
                     placement.part(), dashColour(dashes), dashColour(1 - dashes));
             case PHOTO -> session.drawPlainView(frame.pixels(), placement.port(),
                     placement.part());
-            case GREY_REST, REVERSE, MASK -> drawSamples(frame, placement.part(), dashes);
+            default -> throw new IllegalArgumentException("no view of the library's own");
         }
     }
 
@@ -157,7 +171,8 @@ final class Renderer {
                 case GREY_REST -> Util.draw_withmask(pixels, drawing, selection, columns, all);
                 case REVERSE -> Util.draw_reversemask(pixels, drawing, selection, columns, rows);
                 case MASK -> drawMask();
-                case PHOTO -> throw new IllegalStateException("the photo alone never changes");
+                case PHOTO -> Util.native_drawImage(drawing, columns, rows, pixels, columns, rows, 1,
+                        0, 0, all);
             }
         }
 

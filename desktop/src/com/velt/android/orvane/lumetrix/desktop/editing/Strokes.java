@@ -6,6 +6,7 @@ import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.Mode;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 import java.util.List;
+import java.util.function.BooleanSupplier;
 import java.util.function.Consumer;
 import java.util.stream.IntStream;
 
@@ -18,6 +19,7 @@ import java.util.stream.IntStream;
 final class Strokes {
     private final SelectionSession session;
     private final Consumer<Area> changed;
+    private BooleanSupplier goesOn;
     private Mode mode;      // of the stroke under way, or null
     private Point lastDab;  // may lie outside the photo
     private Point pointer;
@@ -45,10 +47,16 @@ final class Strokes {
         return nanos;
     }
 
-    /** Begins a stroke and sets its first dab. */
-    void begin(Mode strokeMode, Brush brush, int x, int y) {
+    /**
+     * Begins a stroke and sets its first dab.
+     *
+     * @param goesOnStill is asked before each dab, for a fast hand is far ahead on a large photo;
+     *     once it says no, the stroke sets no more of them
+     */
+    void begin(Mode strokeMode, Brush brush, int x, int y, BooleanSupplier goesOnStill) {
         setBrush(brush);
         session.begin(strokeMode);
+        goesOn = goesOnStill;
         mode = strokeMode;
         reason = Hints.OUTSIDE;
         dabs = 0;
@@ -80,7 +88,7 @@ final class Strokes {
         lastDab = point;
         boolean onPhoto = point.x >= 0 && point.x < session.width() && point.y >= 0
                 && point.y < session.height();
-        if (!onPhoto) return;
+        if (!onPhoto || !goesOn.getAsBoolean()) return;
         if (dabs == 0) reason = Hints.reason(session, mode, point.x, point.y);
         ++dabs;
         long start = System.nanoTime();

@@ -49,7 +49,7 @@ class StrokesTest {
     }
 
     private void stroke(Mode mode, Brush brush, int... points) {
-        strokes.begin(mode, brush, points[0], points[1]);
+        strokes.begin(mode, brush, points[0], points[1], () -> true);
         for (int i = 2; i < points.length; i += 2) strokes.moveTo(points[i], points[i + 1]);
         strokes.end();
     }
@@ -66,7 +66,7 @@ class StrokesTest {
 
     @Test
     void dabFollowsASpacingAwayFromTheLastOne() {
-        strokes.begin(Mode.PAINT, BRUSH, 20, 20);
+        strokes.begin(Mode.PAINT, BRUSH, 20, 20, () -> true);
         strokes.moveTo(24, 24);
         assertEquals(1, strokes.dabs());
         strokes.moveTo(25, 24);
@@ -119,12 +119,24 @@ class StrokesTest {
 
     @Test
     void changesAreToldAfterEachDab() {
-        strokes.begin(Mode.PAINT, BRUSH, 50, 50);
+        strokes.begin(Mode.PAINT, BRUSH, 50, 50, () -> true);
         assertEquals(List.of(new Area(40, 40, 59, 59)), changes);
         strokes.moveTo(55, 50);
         assertEquals(2, changes.size());
         strokes.end();
         assertEquals(new Area(40, 40, 64, 59), changes.get(2));
+    }
+
+    @Test
+    void strokeThatIsCutSetsNoMoreDabs() {
+        boolean[] cut = {false};
+        strokes.begin(Mode.PAINT, BRUSH, 20, 20, () -> !cut[0]);
+        strokes.moveTo(30, 20);
+        cut[0] = true;
+        strokes.moveTo(90, 20);
+        strokes.end();
+        assertEquals("paint 20,20 25,20 30,20", script().get(1));
+        assertFalse(strokes.underWay());
     }
 
     @Test
@@ -210,7 +222,7 @@ class StrokesTest {
     @Test
     void smartEraserInsideThatTakesNothingAwaySaysSo() {
         session.invert();
-        strokes.begin(Mode.SHRINK, new Brush(0, 0), 50, 50);
+        strokes.begin(Mode.SHRINK, new Brush(0, 0), 50, 50, () -> true);
         strokes.end();
         assertEquals(WIDTH * HEIGHT, session.selectedPixels());
         assertEquals("Nothing was taken away.", strokes.reason());
