@@ -18,17 +18,29 @@ public record ChildJvm(int status, String out, String err) {
     /** Runs a class with the classes under test, but without any option of this process. */
     public static ChildJvm run(Path scratch, Class<?> main, String... arguments)
             throws IOException, InterruptedException {
+        return run(scratch, List.of("-Djava.awt.headless=true"), main, arguments);
+    }
+
+    /** Runs a class that may want to open windows, where there is no display. */
+    public static ChildJvm runWithoutDisplay(Path scratch, Class<?> main, String... arguments)
+            throws IOException, InterruptedException {
+        return run(scratch, List.of(), main, arguments);
+    }
+
+    private static ChildJvm run(Path scratch, List<String> options, Class<?> main,
+            String... arguments) throws IOException, InterruptedException {
         Path out = scratch.resolve("child.out");
         Path err = scratch.resolve("child.err");
-        List<String> command = new ArrayList<>(List.of(
-                Path.of(System.getProperty("java.home"), "bin", "java").toString(),
-                "-Djava.awt.headless=true", "-cp", classPath(), main.getName()));
+        List<String> command = new ArrayList<>();
+        command.add(Path.of(System.getProperty("java.home"), "bin", "java").toString());
+        command.addAll(options);
+        command.addAll(List.of("-cp", classPath(), main.getName()));
         command.addAll(List.of(arguments));
-        int status = new ProcessBuilder(command)
+        ProcessBuilder child = new ProcessBuilder(command)
                 .redirectOutput(out.toFile())
-                .redirectError(err.toFile())
-                .start()
-                .waitFor();
+                .redirectError(err.toFile());
+        child.environment().remove("DISPLAY");
+        int status = child.start().waitFor();
         return new ChildJvm(status, read(out), read(err));
     }
 

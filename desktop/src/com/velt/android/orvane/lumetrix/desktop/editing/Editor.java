@@ -158,6 +158,7 @@ public final class Editor implements AutoCloseable {
         }
         lastDrawn = System.nanoTime();
         listener.frameDrawn();
+        if (!sameView) publish();  // how long it took
     }
 
     // Strokes
@@ -414,6 +415,12 @@ public final class Editor implements AutoCloseable {
 
     private static String nameOf(Path file) {
         return String.valueOf(file.getFileName());
+    }
+
+    /** Tells whether something will be unsaved once all that was asked for so far is done. */
+    public CompletableFuture<Boolean> unsaved() {
+        return CompletableFuture.supplyAsync(() -> document != null && document.unsaved(),
+                worker::add);
     }
 
     // Replay

@@ -20,7 +20,8 @@ package com.velt.android.orvane.lumetrix.desktop.editing;
 public record EditorState(OpenedPhoto photo, int selectedPixels, boolean fill, boolean canUndo,
         boolean canRedo, boolean unsaved, long strokeNanos, int strokeDabs, long redrawNanos,
         long changeNanos, String work, int workDone, int workTotal) {
-    static final EditorState EMPTY = new EditorState(null, 0, true, false, false, false, 0, 0, 0,
+    /** Before the first photo. */
+    public static final EditorState EMPTY = new EditorState(null, 0, true, false, false, false, 0, 0, 0,
             0, "", 0, 0);
 
     /** Returns this state with another work. */
