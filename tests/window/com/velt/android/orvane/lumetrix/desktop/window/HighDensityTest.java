@@ -35,28 +35,40 @@ class HighDensityTest {
     void eachPixelOfTheViewIsOneOfTheScreen() {
         assertEquals(SCALE, Hand.inWindow(() -> hand.frame().canvas().deviceScale()));
         hand.drag(Hand.LEFT, 1000, 600, 1100, 600);
+        hand.screenshot("density-" + SCALE);
+        hand.act(VK_H);  // without dashes, which move
         hand.click(hand.frame().getRootPane().getJMenuBar());  // the pointer is off the photo
         hand.act(VK_ESCAPE);
-        hand.screenshot("density-" + SCALE);
         BufferedImage screen = hand.look();
         Point corner = Hand.inWindow(() -> hand.frame().canvas().getLocationOnScreen());
-        int left = (int) Math.floor(corner.x * SCALE);
-        int top = (int) Math.floor(corner.y * SCALE);
-        int[] compared = {0, 0};
+        // The window may begin at any pixel of the screen, which its own units do not tell.
+        int least = Integer.MAX_VALUE;
+        for (int y = -1; y <= 1; ++y) {
+            for (int x = -1; x <= 1; ++x) {
+                least = Math.min(least, differences(screen, (int) (corner.x * SCALE) + x,
+                        (int) (corner.y * SCALE) + y));
+            }
+        }
+        assertEquals(0, least);
+    }
+
+    /** Counts the pixels of the view that differ from those of the screen, from a corner on. */
+    private int differences(BufferedImage screen, int left, int top) {
+        int[] count = {0, 0};
         hand.frame().editor().look(frame -> {
             Placement placement = frame.placement();
             Area seen = placement.seen();
-            for (int y = seen.top() + 2; y <= seen.bottom() - 2; ++y) {
-                for (int x = seen.left() + 2; x <= seen.right() - 2; ++x) {
+            for (int y = seen.top(); y <= seen.bottom(); ++y) {
+                for (int x = seen.left(); x <= seen.right(); ++x) {
                     int drawn = frame.pixels()[y * placement.port().width() + x];
                     int shown = screen.getRGB(left + placement.x() + x, top + placement.y() + y);
-                    ++compared[0];
-                    if ((drawn & 0xFFFFFF) != (shown & 0xFFFFFF)) ++compared[1];
+                    if ((drawn & 0xFFFFFF) != (shown & 0xFFFFFF)) ++count[0];
+                    ++count[1];
                 }
             }
         });
-        assertTrue(compared[0] > 500_000, "compared " + compared[0]);
-        assertEquals(0, compared[1], "other pixels of " + compared[0]);
+        assertTrue(count[1] > 500_000, "compared " + count[1]);
+        return count[0];
     }
 
     @Test
