@@ -25,6 +25,7 @@ public record Photo(int width, int height, int[] pixels) {
     /** Larger photos are refused: pixels, picture and copies for the library take 1.5 GB here. */
     public static final int MOST_PIXELS = 64_000_000;
 
+    private static final int JPEG_BANDS_OF_CMYK = 4;
     private static final int LONGEST_SIDE = SelectionSession.LONGEST_SIDE;
 
     /**
@@ -37,6 +38,7 @@ public record Photo(int width, int height, int[] pixels) {
      * @throws IOException when there is no photo that can be had; the message says why
      */
     public static Photo read(Path file) throws IOException {
+        if (Files.isDirectory(file)) throw new IOException("it is a folder");
         if (!Files.isRegularFile(file)) throw new IOException("there is no such file");
         try (ImageInputStream in = ImageIO.createImageInputStream(file.toFile())) {
             if (in == null) throw new IOException("it cannot be opened");
@@ -61,7 +63,19 @@ public record Photo(int width, int height, int[] pixels) {
             throw new IOException("it has " + width + " x " + height + " pixels, more than "
                     + MOST_PIXELS / 1_000_000 + " million or a side beyond " + LONGEST_SIDE);
         }
-        return new Photo(width, height, pixelsOf(reader.read(0)));
+        // The decoder has no type for some JPEGs of four channels, and takes the rest for
+        // transparent ones.
+        boolean types = reader.getImageTypes(0).hasNext();
+        boolean[] cutOff = {false};
+        reader.addIIOReadWarningListener((source, warning) ->
+                cutOff[0] |= warning.contains("premature end"));  // the rest would be grey
+        BufferedImage image = types ? reader.read(0) : null;
+        boolean jpeg = reader.getFormatName().equalsIgnoreCase("jpeg");
+        if (!types || (jpeg && image.getRaster().getNumBands() == JPEG_BANDS_OF_CMYK)) {
+            throw new IOException("its colours are CMYK, not RGB or grey");
+        }
+        if (cutOff[0]) throw new IOException("it is damaged: its end is missing");
+        return new Photo(width, height, pixelsOf(image));
     }
 
     private static int[] pixelsOf(BufferedImage image) {

@@ -18,6 +18,8 @@ import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.io.TempDir;
 
 class PhotoTest {
+    private static final int JPEG_FRAME = 0xC0;  // the marker before size and channels
+
     @TempDir
     private Path folder;
 
@@ -58,7 +60,7 @@ class PhotoTest {
     @Test
     void missingFilesAndFoldersAreRefused() {
         assertEquals("there is no such file", refusalOf(folder.resolve("none.png")));
-        assertEquals("there is no such file", refusalOf(folder));
+        assertEquals("it is a folder", refusalOf(folder));
     }
 
     @Test
@@ -68,11 +70,33 @@ class PhotoTest {
     }
 
     @Test
+    void jpegOfFourChannelsIsRefused() throws IOException {
+        BufferedImage image = new BufferedImage(8, 8, BufferedImage.TYPE_3BYTE_BGR);
+        ByteArrayOutputStream jpeg = new ByteArrayOutputStream();
+        ImageIO.write(image, "jpeg", jpeg);
+        assertEquals(8, Photo.read(Files.write(folder.resolve("rgb.jpg"), jpeg.toByteArray()))
+                .width());
+        Path cmyk = Files.write(folder.resolve("cmyk.jpg"), withFourthChannel(jpeg.toByteArray()));
+        assertEquals("its colours are CMYK, not RGB or grey", refusalOf(cmyk));
+    }
+
+    @Test
     void truncatedPicturesAreRefused() throws IOException {
         Path file = save(new BufferedImage(50, 50, BufferedImage.TYPE_3BYTE_BGR));
         byte[] whole = Files.readAllBytes(file);
         Files.write(file, Arrays.copyOf(whole, 45));
         assertThrows(IOException.class, () -> Photo.read(file));
+    }
+
+    @Test
+    void truncatedJpegIsRefused() throws IOException {
+        BufferedImage image = new BufferedImage(80, 80, BufferedImage.TYPE_3BYTE_BGR);
+        for (int i = 0; i < 80 * 80; ++i) image.setRGB(i % 80, i / 80, i * 0x10203);
+        ByteArrayOutputStream jpeg = new ByteArrayOutputStream();
+        ImageIO.write(image, "jpeg", jpeg);
+        byte[] half = Arrays.copyOf(jpeg.toByteArray(), jpeg.size() * 2 / 3);
+        assertEquals("it is damaged: its end is missing",
+                refusalOf(Files.write(folder.resolve("half.jpg"), half)));
     }
 
     @Test
@@ -87,6 +111,22 @@ class PhotoTest {
         Path file = folder.resolve("photo.png");
         ImageIO.write(image, "png", file.toFile());
         return file;
+    }
+
+    /** Declares a channel more in a JPEG's frame, with the tables of the third. */
+    private static byte[] withFourthChannel(byte[] jpeg) {
+        int frame = 2;
+        while ((jpeg[frame + 1] & 255) != JPEG_FRAME) {
+            frame += 2 + ((jpeg[frame + 2] & 255) << 8 | jpeg[frame + 3] & 255);
+        }
+        int end = frame + 2 + jpeg[frame + 3];
+        byte[] four = new byte[jpeg.length + 3];
+        System.arraycopy(jpeg, 0, four, 0, end);
+        System.arraycopy(jpeg, end - 3, four, end, jpeg.length - end + 3);
+        four[frame + 3] += 3;
+        four[frame + 9] = 4;
+        four[end] = 4;
+        return four;
     }
 
     private static String refusalOf(Path file) {

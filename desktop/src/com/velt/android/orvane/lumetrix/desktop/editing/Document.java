@@ -13,8 +13,8 @@ final class Document implements AutoCloseable {
     final Renderer renderer;
     int selectedPixels;  // as they were counted last
     int selectedBefore;  // the last stroke
-    int steps;       // that did something, undone and redone ones included
-    int stepsSaved;  // as many of them as there were when the selection was saved last
+    int steps;           // that did something, undone and redone ones included
+    int stepsSaved;      // as many of them as there were when the selection was saved last
 
     /** {@code changed} is told where strokes have changed the selection, as soon as they have. */
     Document(OpenedPhoto photo, Consumer<Area> changed) {

@@ -32,8 +32,12 @@ public final class Editor implements AutoCloseable {
     /** The longest time without a redraw while there is more and more to draw, in nanoseconds. */
     private static final long LONGEST_UNDRAWN = TimeUnit.SECONDS.toNanos(1) / 30;
 
-    /** The longest time in a stroke without counting what is selected. */
+    /** The longest time in a stroke or replay without counting what is selected. */
     private static final long LONGEST_UNCOUNTED = TimeUnit.SECONDS.toNanos(1) / 5;
+
+    private static final String CHOOSE_PHOTO = "Choose a JPEG or PNG file.";
+    private static final String CHOOSE_MASK = "Choose a mask saved from this photo.";
+    private static final String CHOOSE_PLACE = "Choose another place.";
 
     private final EditorListener listener;
     private final Worker worker = new Worker("editor", this::drawWhenIdle, this::failed);
@@ -71,7 +75,8 @@ public final class Editor implements AutoCloseable {
     /** Opens a photo with nothing selected. One that cannot be read leaves all as it is. */
     public void open(Path file) {
         if (refusedInReplay()) return;
-        files.run("Opening " + nameOf(file), nameOf(file) + " cannot be opened", () -> {
+        String name = nameOf(file);
+        files.run("Opening " + name, name + " cannot be opened", CHOOSE_PHOTO, () -> {
             OpenedPhoto photo = OpenedPhoto.read(file);
             worker.add(() -> {
                 boolean fill = document == null || document.session.fill();
@@ -311,10 +316,11 @@ public final class Editor implements AutoCloseable {
     public void loadMask(Path file) {
         edit(() -> {
             OpenedPhoto photo = document.photo;
-            files.run("Loading " + nameOf(file), nameOf(file) + " cannot be loaded", () -> {
-                byte[] mask = PictureFiles.readMask(file, photo.width(), photo.height());
-                worker.add(() -> select(photo, mask, nameOf(file)));
-            });
+            files.run("Loading " + nameOf(file), nameOf(file) + " cannot be loaded", CHOOSE_MASK,
+                    () -> {
+                        byte[] mask = PictureFiles.readMask(file, photo.width(), photo.height());
+                        worker.add(() -> select(photo, mask, nameOf(file)));
+                    });
         });
     }
 
@@ -391,7 +397,7 @@ public final class Editor implements AutoCloseable {
         if (refusedInReplay()) return CompletableFuture.completedFuture(false);
         return CompletableFuture.supplyAsync(() -> takeDown(taking), worker::add)
                 .thenCompose(writing -> files.run("Saving " + nameOf(file),
-                        nameOf(file) + " cannot be saved", () -> {
+                        nameOf(file) + " cannot be saved", CHOOSE_PLACE, () -> {
                             writing.run();
                             say(Message.Kind.DONE, "Saved " + file + ".");
                         }));
@@ -409,18 +415,19 @@ public final class Editor implements AutoCloseable {
 
     private static FileThread.Job failing(String why) {
         return () -> {
-            throw new IOException(why);
+            throw new IllegalStateException(why);
         };
     }
 
     private static String nameOf(Path file) {
-        return String.valueOf(file.getFileName());
+        return file.getFileName() == null ? file.toString() : file.getFileName().toString();
     }
 
     /** Tells whether something will be unsaved once all that was asked for so far is done. */
     public CompletableFuture<Boolean> unsaved() {
-        return CompletableFuture.supplyAsync(() -> document != null && document.unsaved(),
-                worker::add);
+        return CompletableFuture.runAsync(() -> {}, worker::add)  // what to save is taken down
+                .thenCompose(nothing -> files.run("", "", () -> {}))  // and written
+                .thenApplyAsync(written -> document != null && document.unsaved(), worker::add);
     }
 
     // Replay
@@ -473,6 +480,7 @@ public final class Editor implements AutoCloseable {
     /** Is asked before each dab, and shows how far the replay has come. */
     private boolean replayGoesOn() {
         if (System.nanoTime() - lastDrawn > LONGEST_UNDRAWN) {
+            if (System.nanoTime() - lastCounted > LONGEST_UNCOUNTED) count();
             publish();
             drawAll();
         }
@@ -535,8 +543,8 @@ public final class Editor implements AutoCloseable {
     }
 
     /**
-     * Stops a replay, cuts a stroke, finishes what is being saved, and ends the editor's threads. Waits for all of
-     * that, so the listener must not call it.
+     * Stops a replay, cuts a stroke, finishes what is being saved, and ends the editor's threads.
+     * Waits for all of that, so the listener must not call it.
      */
     @Override
     public void close() {

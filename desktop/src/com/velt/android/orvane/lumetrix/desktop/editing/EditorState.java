@@ -21,8 +21,8 @@ public record EditorState(OpenedPhoto photo, int selectedPixels, boolean fill, b
         boolean canRedo, boolean unsaved, long strokeNanos, int strokeDabs, long redrawNanos,
         long changeNanos, String work, int workDone, int workTotal) {
     /** Before the first photo. */
-    public static final EditorState EMPTY = new EditorState(null, 0, true, false, false, false, 0, 0, 0,
-            0, "", 0, 0);
+    public static final EditorState EMPTY = new EditorState(null, 0, true, false, false, false, 0,
+            0, 0, 0, "", 0, 0);
 
     /** Returns this state with another work. */
     EditorState during(String otherWork) {

@@ -31,28 +31,35 @@ final class FileThread implements AutoCloseable {
         this.failed = failed;
     }
 
+    /** Has a job done whose failures nobody can mend by choosing another file. */
+    CompletableFuture<Boolean> run(String what, String failure, Job job) {
+        return run(what, failure, "", job);
+    }
+
     /**
      * Has a job done.
      *
      * @param what what is going on, such as {@code Opening fig.jpg}
      * @param failure what is to be said when it fails, up to the colon
+     * @param cure a sentence about how to mend what is wrong with the file, or empty
      * @return whether it was done; after closing it never is
      */
-    CompletableFuture<Boolean> run(String what, String failure, Job job) {
+    CompletableFuture<Boolean> run(String what, String failure, String cure, Job job) {
         try {
-            return CompletableFuture.supplyAsync(() -> isDone(what, failure, job), executor);
+            return CompletableFuture.supplyAsync(() -> isDone(what, failure, cure, job), executor);
         } catch (RejectedExecutionException e) {
             return CompletableFuture.completedFuture(false);
         }
     }
 
-    private boolean isDone(String what, String failure, Job job) {
+    private boolean isDone(String what, String failure, String cure, Job job) {
         busy.accept(what);
         try {
             job.run();
             return true;
         } catch (IOException | RuntimeException | OutOfMemoryError e) {
-            failed.accept(failure + ": " + Troubles.describe(e) + ".");
+            boolean curable = e instanceof IOException && !cure.isEmpty();
+            failed.accept(failure + ": " + Troubles.describe(e) + (curable ? ". " + cure : "."));
             return false;
         } finally {
             busy.accept("");

@@ -5,7 +5,8 @@ import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 
 /** Says why a stroke did nothing. */
 final class Hints {
-    static final String OUTSIDE = "The stroke missed the photo.";
+    static final String OUTSIDE = "The middle of the brush was never on the photo.";
+    static final String CUT = "The stroke was stopped before its first dab.";
     static final String LASSO_TOO_SHORT = "A lasso needs three corners or more: drag it around the"
             + " object.";
     static final String LASSO_OPEN = "Filling is off, so a lasso leaves only its outline. Switch"

@@ -9,10 +9,10 @@ import com.velt.android.orvane.lumetrix.selection.SelectionSession;
 /**
  * Draws what is seen of a session's photo and selection, with the library's drawing methods.
  *
- * <p>{@link #drawDirectly} draws the visible part of the photo as the app does. Others give the same
- * picture sooner: a virtual machine copies whole photos for each drawing, so {@link #drawChange}
- * first samples photo and mask where a dab can be seen, and draws these small samples; and so does
- * {@link #drawWhole} where the photo is large beside the view.
+ * <p>{@link #drawDirectly} draws the visible part of the photo as the app does. Others give the
+ * same picture sooner: a virtual machine copies whole photos for each drawing, so
+ * {@link #drawChange} first samples photo and mask where a dab can be seen, and draws these small
+ * samples; and so does {@link #drawWhole} where the photo is large beside the view.
  */
 final class Renderer {
     /** How many times the pixels of a view a photo has for samples to be drawn sooner; measured. */
@@ -171,8 +171,8 @@ final class Renderer {
                 case GREY_REST -> Util.draw_withmask(pixels, drawing, selection, columns, all);
                 case REVERSE -> Util.draw_reversemask(pixels, drawing, selection, columns, rows);
                 case MASK -> drawMask();
-                case PHOTO -> Util.native_drawImage(drawing, columns, rows, pixels, columns, rows, 1,
-                        0, 0, all);
+                case PHOTO -> Util.native_drawImage(drawing, columns, rows, pixels, columns, rows,
+                        1, 0, 0, all);
             }
         }
 

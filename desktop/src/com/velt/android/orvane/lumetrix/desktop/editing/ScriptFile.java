@@ -45,7 +45,8 @@ final class ScriptFile {
             return OpenedPhoto.readWhole(file.resolveSibling(script.photo()));
         } catch (IOException | InvalidPathException e) {
             throw new IOException("the photo \"" + script.photo() + "\" in line "
-                    + script.photoLine() + " cannot be read: " + Troubles.describe(e), e);
+                    + script.photoLine() + " cannot be read: " + Troubles.describe(e)
+                    + "; correct that line or put a photo there", e);
         }
     }
 

@@ -88,7 +88,11 @@ final class Strokes {
         lastDab = point;
         boolean onPhoto = point.x >= 0 && point.x < session.width() && point.y >= 0
                 && point.y < session.height();
-        if (!onPhoto || !goesOn.getAsBoolean()) return;
+        if (!onPhoto) return;
+        if (!goesOn.getAsBoolean()) {
+            if (dabs == 0) reason = Hints.CUT;
+            return;
+        }
         if (dabs == 0) reason = Hints.reason(session, mode, point.x, point.y);
         ++dabs;
         long start = System.nanoTime();

@@ -11,7 +11,7 @@ final class Troubles {
     /** Returns what went wrong, to stand behind a colon. */
     static String describe(Throwable trouble) {
         if (trouble instanceof OutOfMemoryError) {
-            return "it does not fit into memory; give Java more, such as with -Xmx4g";
+            return "it does not fit into memory; for more, start with JAVA_TOOL_OPTIONS=-Xmx4g set";
         }
         if (trouble instanceof AccessDeniedException) return "access is denied";
         if (trouble instanceof NoSuchFileException) return "there is no such file";

@@ -33,7 +33,8 @@ enum Act {
     REDO(Group.EDIT, "Redo", "Brings back what was undone last.", "ctrl shift Z", "ctrl Y"),
     CLEAR(Group.EDIT, "Clear", "Selects nothing.", "DELETE", "BACK_SPACE"),
     INVERT(Group.EDIT, "Invert", "Selects what is not selected, and nothing else.", "I", "ctrl I"),
-    FILL(Group.EDIT, "Fill", "Strokes fill holes, erase what they cut off, and fill lassos.", "G"),
+    FILL(Group.EDIT, "Fill", "Strokes fill holes and erase what they cut off; lassos are"
+            + " filled.", "G"),
 
     SMART_BRUSH(Group.TOOL, "Smart brush", "Selects up to where the colour changes.", "S"),
     SMART_ERASER(Group.TOOL, "Smart eraser", "Takes away up to where the colour changes.", "D"),
@@ -46,7 +47,8 @@ enum Act {
             + " always takes.", "typed {"),
     CORE_LARGER(Group.TOOL, "Larger core", "Makes the core of a smart tool larger: what it always"
             + " takes.", "typed }"),
-    SAME_SIZE(Group.TOOL, "Same size at any zoom", "Keeps the brush as large on the screen.", "C"),
+    SAME_SIZE(Group.TOOL, "Same size at any zoom", "Keeps the brush the same size on the screen.",
+            "C"),
 
     OUTLINE(Group.VIEW, "Outline", "Shows a dashed line around the selection.", "F2"),
     GREY_REST(Group.VIEW, "Grey rest", "Shows the selection in colour, the rest grey.", "F3"),
@@ -65,20 +67,27 @@ enum Act {
 
     /** The menu that an act is in. */
     enum Group {
-        FILE("File"),
-        EDIT("Edit"),
-        TOOL("Tool"),
-        VIEW("View"),
-        HELP("Help");
+        FILE("File", 'F'),
+        EDIT("Edit", 'I'),  // Alt and E is the eraser
+        TOOL("Tool", 'T'),
+        VIEW("View", 'V'),
+        HELP("Help", 'H');
 
         private final String title;
+        private final char letter;
 
-        Group(String title) {
+        Group(String title, char letter) {
             this.title = title;
+            this.letter = letter;
         }
 
         String title() {
             return title;
+        }
+
+        /** Returns the letter that opens the menu together with Alt. */
+        char letter() {
+            return letter;
         }
 
         List<Act> acts() {

@@ -1,11 +1,13 @@
 package com.velt.android.orvane.lumetrix.desktop.window;
 
 import java.awt.event.ActionEvent;
+import java.awt.event.InputEvent;
 import java.util.EnumMap;
 import java.util.Map;
 import java.util.function.BooleanSupplier;
 import javax.swing.AbstractAction;
 import javax.swing.Action;
+import javax.swing.InputMap;
 import javax.swing.JComponent;
 import javax.swing.JRootPane;
 import javax.swing.KeyStroke;
@@ -67,12 +69,19 @@ final class Actions {
         of(act).putValue(Action.SELECTED_KEY, on);
     }
 
-    /** Makes all keys work wherever the focus is in the window. */
+    /**
+     * Makes all keys work wherever the focus is in the window, and those of tools also while Alt
+     * is held, which has the tool do its opposite.
+     */
     void bindKeys(JRootPane pane) {
         for (Act act : Act.values()) {
             pane.getActionMap().put(act.name(), of(act));
+            InputMap keys = pane.getInputMap(JComponent.WHEN_IN_FOCUSED_WINDOW);
             for (KeyStroke key : act.keys()) {
-                pane.getInputMap(JComponent.WHEN_IN_FOCUSED_WINDOW).put(key, act.name());
+                keys.put(key, act.name());
+                if (!ToolBar.TOOL_ACTS.containsValue(act)) continue;
+                keys.put(KeyStroke.getKeyStroke(key.getKeyCode(), InputEvent.ALT_DOWN_MASK),
+                        act.name());
             }
         }
     }

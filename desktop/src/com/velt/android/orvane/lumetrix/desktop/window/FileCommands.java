@@ -33,6 +33,10 @@ final class FileCommands {
 
     /** Opens a photo or replays a script, as its extension says. */
     void use(Path file) {
+        if (model.replaying()) {
+            editor.open(file);  // it says why not
+            return;
+        }
         leaveSelection(() -> {
             files.used(file);
             if (FileType.SCRIPT.fits(file)) {
@@ -96,7 +100,8 @@ final class FileCommands {
         switch (questions.aboutUnsaved(model.state().photo().name())) {
             case SAVE -> save("Save script", FileType.SCRIPT, "", editor::saveScript)
                     .thenAccept(saved -> {
-                        if (saved) SwingUtilities.invokeLater(next);
+                        // There may be another stroke by then.
+                        if (saved) SwingUtilities.invokeLater(() -> leaveSelection(next));
                     });
             case DISCARD -> next.run();
             case CANCEL -> {}

@@ -11,6 +11,7 @@ import javax.swing.JFileChooser;
 import javax.swing.JOptionPane;
 import javax.swing.JTextField;
 import javax.swing.SwingUtilities;
+import javax.swing.UIManager;
 import javax.swing.filechooser.FileNameExtensionFilter;
 
 /** Swing's file dialogues, which begin in the folder that was used last. */
@@ -30,7 +31,7 @@ final class FileDialogs implements FileChoice {
 
     @Override
     public Optional<Path> toSave(String title, FileType type, String suggestion) {
-        JFileChooser chooser = chooser(title, type, new SavingChooser(folder, type));
+        JFileChooser chooser = chooser(title, type, SavingChooser.in(folder, type));
         chooser.setSelectedFile(new File(folder, suggestion));
         return answer(chooser, chooser.showSaveDialog(owner));
     }
@@ -38,7 +39,7 @@ final class FileDialogs implements FileChoice {
     @Override
     public void used(Path file) {
         Path parent = file.toAbsolutePath().getParent();
-        if (parent != null) folder = parent.toFile();
+        if (parent != null && Files.isDirectory(parent)) folder = parent.toFile();
     }
 
     private static JFileChooser chooser(String title, FileType type, JFileChooser chooser) {
@@ -78,11 +79,23 @@ final class FileDialogs implements FileChoice {
     /** Adds the extension, and asks before it replaces a file. */
     private static final class SavingChooser extends JFileChooser {
         private static final long serialVersionUID = 1;
+        private static final String FOLDER_LABEL = "FileChooser.lookInLabelText";
+
         private final FileType type;
 
-        SavingChooser(File folder, FileType type) {
+        private SavingChooser(File folder, FileType type) {
             super(folder);
             this.type = type;
+        }
+
+        /** Nimbus takes the label of opening, and takes it when the chooser is made. */
+        static SavingChooser in(File folder, FileType type) {
+            UIManager.put(FOLDER_LABEL, UIManager.getString("FileChooser.saveInLabelText"));
+            try {
+                return new SavingChooser(folder, type);
+            } finally {
+                UIManager.put(FOLDER_LABEL, null);  // the usual one again
+            }
         }
 
         @Override

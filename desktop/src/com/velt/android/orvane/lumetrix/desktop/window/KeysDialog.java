@@ -6,6 +6,7 @@ import java.awt.Frame;
 import java.awt.GridBagConstraints;
 import java.awt.GridBagLayout;
 import java.awt.Insets;
+import java.awt.Window;
 import java.util.ArrayList;
 import java.util.List;
 import javax.swing.JComponent;
@@ -17,6 +18,7 @@ import javax.swing.KeyStroke;
 
 /** Lists what keys and pointer do. */
 final class KeysDialog {
+    private static final String NAME = "keys";
     private static final int HEIGHT = 620;
     private static final int SCROLL_STEP = 20;
 
@@ -46,10 +48,16 @@ final class KeysDialog {
                 .toList();
     }
 
-    /** Shows the list in a window of its own. */
+    /** Shows the list in a window of its own, which comes to the front if it is there already. */
     static void show(Frame owner) {
+        for (Window window : owner.getOwnedWindows()) {
+            if (window.isShowing() && NAME.equals(window.getName())) {
+                window.toFront();
+                return;
+            }
+        }
         JDialog dialog = new JDialog(owner, "Keys and pointer", false);
-        dialog.setName("keys");
+        dialog.setName(NAME);
         JScrollPane scroll = new JScrollPane(page(), JScrollPane.VERTICAL_SCROLLBAR_ALWAYS,
                 JScrollPane.HORIZONTAL_SCROLLBAR_NEVER);
         scroll.setBorder(Theme.padding(0, 0));

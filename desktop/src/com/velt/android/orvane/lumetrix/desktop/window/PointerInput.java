@@ -3,6 +3,7 @@ package com.velt.android.orvane.lumetrix.desktop.window;
 import android.graphics.Point;
 import com.velt.android.orvane.lumetrix.desktop.editing.Editor;
 import com.velt.android.orvane.lumetrix.desktop.editing.LassoPath;
+import com.velt.android.orvane.lumetrix.desktop.editing.Message;
 import com.velt.android.orvane.lumetrix.desktop.editing.Tool;
 import com.velt.android.orvane.lumetrix.selection.Mode;
 import java.awt.Cursor;
@@ -10,6 +11,7 @@ import java.awt.event.MouseAdapter;
 import java.awt.event.MouseEvent;
 import java.awt.event.MouseWheelEvent;
 import java.util.List;
+import java.util.function.Consumer;
 import javax.swing.SwingUtilities;
 
 /**
@@ -22,11 +24,15 @@ import javax.swing.SwingUtilities;
 final class PointerInput extends MouseAdapter {
     private static final double WHEEL_FACTOR = 1.2;  // for each step of the wheel
 
+    private static final String HIDDEN = "The selection is hidden while the photo is shown alone: "
+            + Act.PHOTO_ALONE.keysInWords() + " shows it.";
+
     private final PhotoCanvas canvas;
     private final ScreenModel model;
     private final Editor editor;
     private final HeldKeys held;
     private final StatusLine status;
+    private final Consumer<Message> say;
     private Drag drag;         // under way, or null
     private int dragButton;
     private double x;          // where the pointer is, in pixels of the screen
@@ -44,12 +50,13 @@ final class PointerInput extends MouseAdapter {
     }
 
     PointerInput(PhotoCanvas canvas, ScreenModel model, Editor editor, HeldKeys held,
-            StatusLine status) {
+            StatusLine status, Consumer<Message> say) {
         this.canvas = canvas;
         this.model = model;
         this.editor = editor;
         this.held = held;
         this.status = status;
+        this.say = say;
         canvas.addMouseListener(this);
         canvas.addMouseMotionListener(this);
         canvas.addMouseWheelListener(this);
@@ -99,6 +106,7 @@ final class PointerInput extends MouseAdapter {
             editor.endStroke();  // there is none, but the editor says why there can be none
             return null;
         }
+        if (model.photoAlone()) say.accept(new Message(Message.Kind.HINT, HIDDEN));
         boolean opposite = right || event.isAltDown();
         Tool tool = model.tool();
         Mode mode = tool.mode(opposite);

@@ -50,7 +50,7 @@ final class ScreenFrame extends JFrame {
         defineActs();
         StatusLine status = new StatusLine(model);
         held = new HeldKeys(canvas);
-        pointer = new PointerInput(canvas, model, editor, held, status);
+        pointer = new PointerInput(canvas, model, editor, held, status, this::tell);
         work = new WorkPanel(model, actions);
         layOut(status);
         actions.bindKeys(getRootPane());

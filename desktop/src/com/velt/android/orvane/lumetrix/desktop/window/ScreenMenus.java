@@ -32,7 +32,7 @@ final class ScreenMenus {
         for (Act.Group group : Act.Group.values()) {
             JMenu menu = new JMenu(group.title());
             menu.setName("menu." + group);
-            menu.setMnemonic(group.title().charAt(0));
+            menu.setMnemonic(group.letter());
             for (Act act : group.acts()) {
                 if (SECTIONS.contains(act)) menu.addSeparator();
                 JMenuItem item = item(act);

@@ -17,6 +17,7 @@ final class StatusLine extends JPanel {
     private static final long serialVersionUID = 1;
     private static final int BETWEEN = 18;
     private static final double NANOS_PER_MILLISECOND = 1e6;
+    private static final int LONGEST_NAME = 32;  // letters
     private static final double TENTHS_BELOW = 100;  // from there on whole numbers do
 
     private final transient ScreenModel model;
@@ -82,14 +83,21 @@ final class StatusLine extends JPanel {
         photo.setText(photoText(state.photo()));
         double percent = model.zoomPercent();
         zoom.setText(String.format(Locale.ROOT, percent < 10 ? "%.1f %%" : "%.0f %%", percent));
-        selected.setText(selectedText(state));
+        selected.setText(selectedText(state) + (model.photoAlone() ? " (hidden)" : ""));
         times.setText(timesText(state));
     }
 
     private static String photoText(OpenedPhoto photo) {
-        String size = photo.name() + "  " + photo.width() + " × " + photo.height();
+        String size = shortened(photo.name()) + "  " + photo.width() + " × " + photo.height();
         if (!photo.isReduced()) return size;
         return size + " (reduced from " + photo.fileWidth() + " × " + photo.fileHeight() + ")";
+    }
+
+    /** Leaves out the middle of a long name, which the window's title shows whole. */
+    private static String shortened(String name) {
+        if (name.length() <= LONGEST_NAME) return name;
+        int half = LONGEST_NAME / 2;
+        return name.substring(0, half) + "…" + name.substring(name.length() - half + 1);
     }
 
     private String toolText() {
@@ -113,7 +121,7 @@ final class StatusLine extends JPanel {
         String redraw = "view " + milliseconds(state.redrawNanos());
         if (state.strokeDabs() == 0) return redraw;
         return "stroke " + milliseconds(state.strokeNanos()) + " (" + state.strokeDabs()
-                + (state.strokeDabs() == 1 ? " dab), " : " dabs), ") + redraw;
+                + (state.strokeDabs() == 1 ? " point), " : " points), ") + redraw;
     }
 
     private static String milliseconds(long nanos) {

@@ -40,7 +40,7 @@ final class Theme {
     static final Color ACCENT = new Color(0x4A9BF5);
     static final Color ACCENT_DEEP = new Color(0x2A69B5);
     /** For what takes away from the selection. */
-    static final Color TAKING = new Color(0xFF6FE0);
+    static final Color TAKING = new Color(0xFFC933);
 
     static final int GAP = 8;
     static final int ROUNDING = 6;

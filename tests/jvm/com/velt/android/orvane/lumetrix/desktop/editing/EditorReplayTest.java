@@ -196,6 +196,13 @@ class EditorReplayTest {
     }
 
     @Test
+    void selectedPixelsAreCountedDuringAReplay() throws IOException {
+        editor.replay(endless());
+        listener.awaitState(state -> state.workDone() > 0 && state.selectedPixels() > 0);
+        editor.stopReplay();
+    }
+
+    @Test
     void closingStopsAReplay() throws IOException {
         editor.replay(endless());
         listener.awaitState(state -> state.workDone() > 2);

@@ -139,10 +139,12 @@ class EditorTest {
         stroke(Mode.PAINT, 50, 40);
         EditorState before = state();
         editor.open(Files.writeString(folder.resolve("bad.png"), "no picture"));
-        assertEquals(problem("bad.png cannot be opened: it is no picture."), said());
+        assertEquals(problem("bad.png cannot be opened: it is no picture. Choose a JPEG or PNG"
+                + " file."), said());
         assertEquals(before, state());
         editor.open(folder.resolve("none.png"));
-        assertEquals(problem("none.png cannot be opened: there is no such file."), said());
+        assertEquals(problem("none.png cannot be opened: there is no such file. Choose a JPEG or"
+                + " PNG file."), said());
         assertEquals(before, state());
     }
 
@@ -489,7 +491,8 @@ class EditorTest {
         stroke(Mode.PAINT, 60, 40);
         Path missing = folder.resolve("none");
         assertFalse(editor.saveMask(missing.resolve("m.png")).join());
-        assertEquals(problem("m.png cannot be saved: there is no folder " + missing + "."), said());
+        assertEquals(problem("m.png cannot be saved: there is no folder " + missing
+                + ". Choose another place."), said());
         assertFalse(editor.saveScript(Path.of("/")).join());
         assertEquals(1, said().size());
         assertTrue(state().unsaved());
@@ -539,10 +542,27 @@ class EditorTest {
     }
 
     @Test
+    void whatIsBeingSavedCountsAsSaved() {
+        open();
+        stroke(Mode.PAINT, 50, 40, 60, 40);
+        assertTrue(editor.unsaved().join());
+        editor.saveMask(folder.resolve("m.png"));
+        assertFalse(editor.unsaved().join());
+    }
+
+    @Test
+    void rootOfAllFoldersIsRefusedByItsName() {
+        editor.open(Path.of("/"));
+        assertEquals(problem("/ cannot be opened: it is a folder. Choose a JPEG or PNG file."),
+                said());
+    }
+
+    @Test
     void maskOfAnotherSizeIsRefused() throws IOException {
         open();
         editor.loadMask(Photos.save(folder.resolve("m.png"), 3, 2));
-        assertEquals(problem("m.png cannot be loaded: it has 3 x 2 pixels, the photo 120 x 80."),
+        assertEquals(problem("m.png cannot be loaded: it has 3 x 2 pixels, the photo 120 x 80."
+                + " Choose a mask saved from this photo."),
                 said());
         assertFalse(state().canUndo());
     }

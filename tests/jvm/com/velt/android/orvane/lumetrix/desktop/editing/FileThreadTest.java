@@ -47,9 +47,21 @@ class FileThreadTest {
     }
 
     @Test
+    void cureIsSaidOfWhatIsWrongWithAFileAndOfNothingElse() {
+        files.run("", "a.png cannot be opened", "Choose a PNG file.", () -> {
+            throw new IOException("it is no picture");
+        }).join();
+        files.run("", "a.png cannot be opened", "Choose a PNG file.", () -> {
+            throw new IllegalStateException("a stroke is under way");
+        }).join();
+        assertEquals(List.of("<>", "a.png cannot be opened: it is no picture. Choose a PNG file.",
+                "<>", "<>", "a.png cannot be opened: a stroke is under way.", "<>"), told);
+    }
+
+    @Test
     void troublesAreSaidInWords() {
-        assertEquals("x: it does not fit into memory; give Java more, such as with -Xmx4g.",
-                reason(() -> {
+        assertEquals("x: it does not fit into memory; for more, start with"
+                + " JAVA_TOOL_OPTIONS=-Xmx4g set.", reason(() -> {
                     throw new OutOfMemoryError();
                 }));
         assertEquals("x: access is denied.", reason(() -> {

@@ -102,7 +102,8 @@ class ScriptFileTest {
         Photos.save(folder.resolve("a.png"), 3, 2);
         assertEquals("s.strokes:2: the point 3,0 lies outside the photo, expected 0,0 to 2,1",
                 refusalOf("photo a.png\npaint 3,0\n"));
-        assertEquals("the photo \"b.png\" in line 1 cannot be read: there is no such file",
+        assertEquals("the photo \"b.png\" in line 1 cannot be read: there is no such file;"
+                + " correct that line or put a photo there",
                 refusalOf("photo b.png\n"));
         assertEquals("s.strokes:1: the script ends without a photo, expected photo FILE as the"
                 + " first command", refusalOf(""));

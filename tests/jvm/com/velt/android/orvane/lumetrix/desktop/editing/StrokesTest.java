@@ -140,6 +140,14 @@ class StrokesTest {
     }
 
     @Test
+    void strokeThatIsCutBeforeItsFirstDabSaysSo() {
+        strokes.begin(Mode.PAINT, BRUSH, 20, 20, () -> false);
+        strokes.end();
+        assertEquals(Hints.CUT, strokes.reason());
+        assertEquals(0, strokes.dabs());
+    }
+
+    @Test
     void lassoIsOneStroke() {
         strokes.lasso(Mode.LASSO_ADD,
                 List.of(new Point(10, 10), new Point(50, 10), new Point(30, 60)));

@@ -2,6 +2,7 @@ package com.velt.android.orvane.lumetrix.desktop.window;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertNotEquals;
 import static org.junit.jupiter.api.Assertions.assertNotNull;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
@@ -70,6 +71,15 @@ class ActTest {
         assertEquals(EnumSet.allOf(Tool.class), ToolBar.TOOL_ACTS.keySet());
         assertEquals(EnumSet.complementOf(EnumSet.of(ViewKind.PHOTO)),
                 OptionsBar.VIEW_ACTS.keySet());
+    }
+
+    @Test
+    void noMenuOpensByTheKeyOfAToolWithAlt() {
+        for (Act tool : ToolBar.TOOL_ACTS.values()) {
+            for (Act.Group group : Act.Group.values()) {
+                assertNotEquals(tool.keys().get(0).getKeyCode(), group.letter(), tool.name());
+            }
+        }
     }
 
     @Test

@@ -25,6 +25,7 @@ import java.util.function.BooleanSupplier;
 import java.util.function.Predicate;
 import javax.imageio.ImageIO;
 import javax.swing.JButton;
+import javax.swing.JLabel;
 import javax.swing.SwingUtilities;
 
 /**
@@ -157,6 +158,11 @@ final class Hand implements AutoCloseable {
     /** Returns a button of a dialogue, by its text. */
     Optional<JButton> findButton(String text) {
         return find(JButton.class, button -> text.equals(button.getText()));
+    }
+
+    /** Returns a label of any window that is shown, by its text. */
+    Optional<JLabel> findLabel(String text) {
+        return find(JLabel.class, label -> text.equals(label.getText()));
     }
 
     private <T extends Component> Optional<T> find(Class<T> type, Predicate<T> wanted) {

@@ -15,13 +15,17 @@ import java.awt.image.BufferedImage;
 import java.io.IOException;
 import java.nio.file.Files;
 import java.nio.file.Path;
+import java.util.Arrays;
 import java.util.List;
 import javax.imageio.ImageIO;
 import javax.swing.JButton;
 import javax.swing.JComponent;
+import javax.swing.JDialog;
 import javax.swing.JFileChooser;
 import javax.swing.JLabel;
 import javax.swing.JOptionPane;
+import javax.swing.JProgressBar;
+import javax.swing.JScrollPane;
 import javax.swing.TransferHandler;
 import org.junit.jupiter.api.AfterEach;
 import org.junit.jupiter.api.Test;
@@ -63,6 +67,19 @@ class WindowTest {
         hand.act(VK_I);  // nothing to invert
         hand.act(VK_CONTROL, VK_Z);
         assertEquals(0, hand.state().selectedPixels());
+    }
+
+    @Test
+    void theListOfKeysIsShownOnce() {
+        hand = Hand.on();
+        hand.keys(VK_F1);
+        hand.await("list", () -> hand.find(JScrollPane.class).isPresent());
+        hand.screenshot("keys");
+        hand.click(hand.find(JComponent.class, "status").orElseThrow());
+        hand.await("focus", () -> hand.frame().isFocused());
+        hand.act(VK_F1);
+        assertEquals(1, Hand.inWindow(() -> Arrays.stream(hand.frame().getOwnedWindows())
+                .filter(window -> window.isShowing() && window instanceof JDialog).count()));
     }
 
     @Test
@@ -135,6 +152,20 @@ class WindowTest {
         assertTrue(selected(new int[] {950, 600}));
         assertTrue(selected(new int[] {1150, 600}));
         assertFalse(hand.state().fill());
+    }
+
+    @Test
+    void toolsAreChosenWhileAltIsHeld() {
+        hand = Hand.on(FIG);
+        hand.moveTo(900, 600);
+        hand.hold(VK_ALT);
+        hand.act(VK_B);
+        assertEquals(Tool.BRUSH, hand.frame().model().tool());
+        hand.act(VK_E);
+        assertEquals(Tool.ERASER, hand.frame().model().tool());
+        hand.drag(Hand.LEFT, 900, 600, 1000, 600);
+        hand.letGo(VK_ALT);
+        assertTrue(hand.state().selectedPixels() > 0, "the eraser's opposite adds");
     }
 
     @Test
@@ -256,6 +287,20 @@ class WindowTest {
     }
 
     @Test
+    void aStrokeOverThePhotoAloneSaysThatTheSelectionIsHidden() {
+        hand = Hand.on(FIG);
+        hand.act(VK_H);
+        hand.drag(Hand.LEFT, 1000, 600, 1050, 600);
+        JLabel toast = hand.find(JLabel.class, "toast").orElseThrow();
+        assertTrue(toast.getText().contains("selection is hidden"), toast.getText());
+        JLabel selected = hand.find(JLabel.class, "status.selected").orElseThrow();
+        assertTrue(selected.getText().endsWith("(hidden)"), selected.getText());
+        hand.screenshot("hidden");
+        hand.act(VK_H);
+        assertFalse(selected.getText().contains("hidden"), selected.getText());
+    }
+
+    @Test
     void theCircleAtThePointerHasTheBrushsSize() {
         hand = Hand.on(FIG);
         hand.moveTo(600, 600);
@@ -356,7 +401,8 @@ class WindowTest {
             boolean in = (selection.getRGB(place[0], place[1]) & 1) == 1;
             int alpha = picture.getRGB(place[0], place[1]) >>> 24;
             assertEquals(in ? 255 : 0, alpha);
-            if (in) assertEquals(photo.getRGB(place[0], place[1]), picture.getRGB(place[0], place[1]));
+            if (!in) continue;
+            assertEquals(photo.getRGB(place[0], place[1]), picture.getRGB(place[0], place[1]));
         }
     }
 
@@ -419,7 +465,10 @@ class WindowTest {
     void escapeStopsAReplayAndStrokesGoOnFromThere() throws IOException {
         StringBuilder script = new StringBuilder("photo \"" + FIG + "\"\nbrush 60 10\n");
         for (int i = 0; i < 400; ++i) {
-            script.append("grow 300,300 to 1500,900 to 300,900 to 1500,300\n");
+            int x = 200 + i * 7 % 1000;
+            int y = 200 + i * 91 % 800;
+            script.append("grow ").append(x).append(',').append(y).append(" to ").append(x + 120)
+                    .append(',').append(y).append('\n');
         }
         Path file = Files.writeString(folder.resolve("long.strokes"), script);
         hand = Hand.on(FIG);
@@ -427,7 +476,9 @@ class WindowTest {
             hand.frame().use(file);
             return null;
         });
-        hand.await("progress", () -> hand.frame().model().state().workDone() > 0);
+        hand.await("progress", () -> hand.find(JProgressBar.class, "work.bar")
+                .filter(bar -> bar.getValue() >= 40).isPresent());
+        hand.await("selection", () -> hand.state().selectedPixels() > 0);
         hand.picture("replaying");
         hand.keys(VK_ESCAPE);
         hand.settle();
@@ -445,11 +496,40 @@ class WindowTest {
         Path file = Files.writeString(folder.resolve("notes.jpg"), "no picture");
         hand = Hand.on(FIG);
         drop(file);
-        hand.await("message", () -> shows("notes.jpg cannot be opened"));
+        hand.await("message", () -> shows("notes.jpg cannot be opened: it is no picture. Choose a"
+                + " JPEG or PNG file."));
         hand.screenshot("refused");
         hand.act(VK_ENTER);
         assertFalse(Hand.inWindow(() -> shows("notes.jpg")));
         assertEquals("fig.jpg", hand.state().photo().name());
+    }
+
+    @Test
+    void savingAsksForTheFolderToSaveIn() {
+        hand = Hand.on(FIG);
+        hand.keys(VK_CONTROL, VK_S);
+        hand.await("file dialogue", () -> hand.find(JFileChooser.class).isPresent());
+        assertTrue(hand.findLabel("Save In:").isPresent());
+        hand.picture("saving");
+        hand.act(VK_ESCAPE);
+        hand.keys(VK_CONTROL, VK_O);
+        hand.await("file dialogue", () -> hand.find(JFileChooser.class).isPresent());
+        assertTrue(hand.findLabel("Look In:").isPresent());
+        hand.act(VK_ESCAPE);
+    }
+
+    @Test
+    void aFolderThatIsMissingIsNotWhereTheNextFileIsLookedFor() {
+        hand = Hand.on(FIG);
+        hand.act(VK_CONTROL, VK_S);
+        enterFile(folder.resolve("none").resolve("fig.strokes"));
+        hand.await("message", () -> shows("Choose another place."));
+        hand.act(VK_ENTER);
+        hand.keys(VK_CONTROL, VK_S);
+        hand.await("file dialogue", () -> hand.find(JFileChooser.class).isPresent());
+        assertEquals(FIG.getParent().toFile(),
+                hand.find(JFileChooser.class).orElseThrow().getCurrentDirectory());
+        hand.act(VK_ESCAPE);
     }
 
     @Test
