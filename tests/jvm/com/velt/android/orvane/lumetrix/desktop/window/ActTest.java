@@ -8,6 +8,9 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.velt.android.orvane.lumetrix.desktop.editing.Tool;
 import com.velt.android.orvane.lumetrix.desktop.editing.ViewKind;
+import java.io.IOException;
+import java.nio.file.Files;
+import java.nio.file.Path;
 import java.util.Arrays;
 import java.util.EnumSet;
 import java.util.HashMap;
@@ -38,6 +41,17 @@ class ActTest {
             assertFalse(act.keys().isEmpty(), act.name());
             assertTrue(titles.add(act.title()), act.name());
             assertTrue(act.help().endsWith("."), act.help());
+        }
+    }
+
+    @Test
+    void thePageAboutTheScreenNamesEveryKey() throws IOException {
+        Path page = Path.of(System.getProperty("desktop.folder"), "..", "docs", "screen.md");
+        String text = Files.readString(page);
+        for (Act act : Act.values()) {
+            for (String key : act.keysInWords().split(" or ")) {
+                assertTrue(text.contains("`" + key + "`"), act + ": " + key);
+            }
         }
     }
 
