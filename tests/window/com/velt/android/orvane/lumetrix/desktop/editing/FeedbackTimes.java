@@ -22,8 +22,8 @@ public final class FeedbackTimes {
     private static final int VIEW_HEIGHT = 900;
     private static final int RADIUS = 40;
     private static final int CORE = 12;
-    private static final int WARM_UP = 60;
-    private static final int DABS = 200;
+    private static final int WARM_UP = 40;
+    private static final int DABS = 100;
 
     private final BlockingQueue<Long> frames = new LinkedBlockingQueue<>();
     private volatile EditorState state = EditorState.EMPTY;

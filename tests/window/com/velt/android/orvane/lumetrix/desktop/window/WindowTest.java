@@ -42,6 +42,9 @@ class WindowTest {
         1145, 463, 1192, 498, 1232, 550, 1250, 600, 1247, 650, 1232, 692, 1204, 730, 1194, 785,
         1168, 843, 1120, 886, 1065, 900, 1015, 890, 962, 852, 922, 808, 890, 765, 872, 720,
         862, 670, 858, 610, 880, 570, 912, 530};
+    // Corners of a lasso around the fig.
+    private static final int[] AROUND = {845, 480, 960, 415, 1110, 395, 1240, 455, 1310, 590,
+        1290, 760, 1210, 890, 1080, 950, 950, 920, 850, 800, 790, 680, 740, 590, 760, 520};
     private static final int[] FLESH = {1050, 650};
     private static final int[] BOWL = {1400, 420};
 
@@ -172,13 +175,13 @@ class WindowTest {
     void theLassoAddsWhatItEnclosesAndTheRightButtonTakesIt() throws IOException {
         hand = Hand.on(FIG);
         hand.act(VK_L);
-        hand.beginDrag(Hand.LEFT, 800, 400, 1300, 400, 1300, 900, 800, 900);
+        hand.beginDrag(Hand.LEFT, AROUND);
         hand.screenshot("lasso");
         hand.release(Hand.LEFT);
         assertTrue(selected(FLESH));
         assertFalse(selected(BOWL));
         int before = hand.state().selectedPixels();
-        assertEquals(500 * 500, before, 8000);
+        assertEquals(areaOf(AROUND), before, 8000);
         hand.drag(Hand.RIGHT, 950, 550, 1150, 550, 1150, 750, 950, 750);
         assertFalse(selected(FLESH));
         assertEquals(before - 200 * 200, hand.state().selectedPixels(), 4000);
@@ -569,6 +572,15 @@ class WindowTest {
         hand.frame().editor().saveMask(file).join();
         hand.settle();
         return (ImageIO.read(file.toFile()).getRGB(place[0], place[1]) & 0xFFFFFF) == 0xFFFFFF;
+    }
+
+    private static double areaOf(int[] corners) {
+        double twice = 0;
+        for (int i = 0; i < corners.length; i += 2) {
+            int next = (i + 2) % corners.length;
+            twice += (double) corners[i] * corners[next + 1] - (double) corners[next] * corners[i + 1];
+        }
+        return Math.abs(twice) / 2;
     }
 
     private static boolean isGrey(int pixel) {
