@@ -78,7 +78,7 @@ final class ScreenModel {
         tool = next;
     }
 
-    /** Returns the view chosen, whether or not the photo is shown alone for now. */
+    /** Returns the view chosen, also while the photo is shown alone. */
     ViewKind chosenKind() {
         return kind;
     }
