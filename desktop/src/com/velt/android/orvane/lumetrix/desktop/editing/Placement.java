@@ -12,7 +12,8 @@ import com.velt.android.orvane.lumetrix.selection.Viewport;
  * @param port the drawing: its size, scale and offset
  * @param part the rectangle of it that is drawn: the visible part of the photo and, where the photo
  *     goes on, a row or column more, for the outlined view dashes selected pixels at this edge.
- *     Every pixel in it samples the photo; nothing is clamped.
+ *     Every pixel in it samples the photo and none is clamped, unless all of a tiny photo lies
+ *     between two screen pixels.
  * @param seen what of the part lies in the window
  * @param x the window's column, in its own pixels, of the drawing's column 0
  * @param y the window's row of the drawing's row 0
