@@ -141,7 +141,10 @@ def run_job(args, name):
     result = subprocess.run(command, stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True)
     if result.returncode != 0:
         sys.exit(f"\nreport: '{shlex.join(command)}' failed:\n{result.stderr}")
-    return Job(name, json.loads(result.stdout)["benchmarks"])
+    job = Job(name, json.loads(result.stdout)["benchmarks"])
+    if not job.time("ours"):
+        sys.exit(f"\nreport: '{shlex.join(command)}' did not time the library:\n{result.stderr}")
+    return job
 
 
 def measure(args):

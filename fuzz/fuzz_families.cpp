@@ -15,12 +15,17 @@ namespace {
 std::vector<const family*> fuzzed_families() {
     std::vector<const family*> chosen;
     for (const char* const name : {FUZZED_FAMILIES}) {
+        const size_t before = chosen.size();
         for (const auto* families :
              {&queue_families, &stroke_families, &region_families, &session_families,
               &rendering_families, &fixed_point_families}) {
             for (const family& f : *families) {
                 if (f.name == std::string(name)) chosen.push_back(&f);
             }
+        }
+        if (chosen.size() == before) {
+            std::fprintf(stderr, "there is no family %s; see fuzz/CMakeLists.txt\n", name);
+            std::abort();
         }
     }
     return chosen;

@@ -1,7 +1,8 @@
 #include "selection/D_Queue.h"
 
-#include <algorithm>
 #include <new>
+
+#include "support/arithmetic.h"
 
 namespace {
 
@@ -114,10 +115,10 @@ int D_Queue::push(node* n) {
     } else if (count >= 1) {
         if (!push_linear(*this, n)) return 0;
     }
-    ++count;
+    count = wrap_add(count, 1);
     if (count % step == 0) {
-        const int k = count / step - 1;
-        if (k >= 0 && k < QUEUE_INDEX_ENTRIES) index[k] = tail;
+        const int steps = count / step;
+        if (steps >= 1 && steps <= QUEUE_INDEX_ENTRIES) index[steps - 1] = tail;
     }
     return 1;
 }
@@ -127,7 +128,7 @@ node* D_Queue::pop() {
     head = cheapest->next;
     if (head) head->prev = nullptr;
     for (int k = 0; k < QUEUE_INDEX_ENTRIES && index[k]; ++k) index[k] = index[k]->next;
-    count = std::max(count - 1, 0);
+    count = count > 1 ? count - 1 : 0;
     return cheapest;
 }
 

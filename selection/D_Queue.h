@@ -44,7 +44,7 @@ public:
     // Deliberate: with at most `step` nodes queued, n goes behind its equals; with more, in front
     // of them. A new head keeps its old `prev`, and among two or more nodes and at most `step` even
     // gets itself as `prev`; pop clears the `prev` of each new head, and nothing reads a head's.
-    // With a head but `count` <= 0, n is counted and not linked.
+    // With a head but `count` <= 0, n is counted and not linked. `count` wraps.
     int push(node* n);
 
     // Removes and returns the cheapest node, its links as they were. REQUIRES: `head` and `index`

@@ -4,6 +4,7 @@ and that building it twice gives the same bytes.
 """
 
 import argparse
+import os
 import pathlib
 import re
 import shutil
@@ -25,8 +26,11 @@ MAY_NEED = re.compile(r"lib(log|m|c|dl)\.so(\.\d+)?|ld-linux[-\w]*\.so\.\d+")
 
 def output_of(*command):
     """What a command prints; ends the check when the command fails."""
-    result = subprocess.run([str(c) for c in command], stdout=subprocess.PIPE,
-                            stderr=subprocess.STDOUT, text=True)
+    try:
+        result = subprocess.run([str(c) for c in command], stdout=subprocess.PIPE, text=True,
+                                stderr=subprocess.STDOUT, env=dict(os.environ, LC_ALL="C"))
+    except OSError as error:
+        sys.exit(f"binary: {command[0]} cannot be run ({error.strerror}); ./dev binary installs it")
     if result.returncode != 0:
         sys.exit(f"binary: {' '.join(map(str, command))} failed:\n{result.stdout}")
     return result.stdout
@@ -36,8 +40,11 @@ def output_of(*command):
 # Each check returns "" or what is wrong.
 
 def listed_exports():
-    return {line for line in (ROOT / "exports.txt").read_text().splitlines()
-            if line and not line.startswith("#")}
+    names = {line for line in (ROOT / "exports.txt").read_text().splitlines()
+             if line and not line.startswith("#")}
+    if not names:
+        sys.exit("binary: exports.txt lists no name; list what the library exports")
+    return names
 
 
 def check_exports(library):
@@ -57,8 +64,10 @@ def names_in(entries):
 
 
 def check_needed(library):
-    return " ".join(name for name in names_in(dynamic_entries(library, "NEEDED"))
-                    if not MAY_NEED.fullmatch(name))
+    names = names_in(dynamic_entries(library, "NEEDED"))
+    if not any(name.startswith("liblog.so") for name in names):
+        return "the Android log is not among what it needs"
+    return " ".join(name for name in names if not MAY_NEED.fullmatch(name))
 
 
 def check_soname(library):
@@ -73,13 +82,19 @@ def segments(library, kind):
 
 
 def is_64_bit(library):
-    return "ELF64" in output_of("readelf", "-h", library)
+    size = re.search(r"ELF(32|64)", output_of("readelf", "-h", library))
+    if not size:
+        sys.exit(f"binary: readelf does not say how many bits {library} has")
+    return size[1] == "64"
 
 
 def check_alignment(library):
     if not is_64_bit(library):
         return ""
-    return " ".join(s[-1] for s in segments(library, "LOAD") if int(s[-1], 16) < PAGE)
+    loaded = segments(library, "LOAD")
+    if not loaded:
+        return "no segment is loaded"
+    return " ".join(s[-1] for s in loaded if int(s[-1], 16) < PAGE)
 
 
 def check_relro(library):
@@ -99,6 +114,8 @@ def check_stack(library):
 
 def check_text_relocations(library):
     entries = output_of("readelf", "-dW", library)
+    if "Dynamic section at" not in entries:
+        return "no dynamic section"
     return "text relocations" if "TEXTREL" in entries else ""
 
 
@@ -114,13 +131,18 @@ LIBRARY_CHECKS = {
 }
 
 
-def check_branch_protection(objects):
-    """The names of the objects without branch protection, of those below a folder."""
-    found = sorted(pathlib.Path(objects).rglob("*.o"))
-    if not found:
-        return f"no objects in {objects}"
-    return " ".join(o.name for o in found
-                    if not re.search("BTI.*PAC", output_of("readelf", "-nW", o)))
+def is_protected(file):
+    """Whether a library or object is marked for AArch64's branch protection, both halves of it."""
+    return re.search("AArch64 feature: BTI, PAC", output_of("readelf", "-nW", file)) is not None
+
+
+def check_branch_protection(library, folders):
+    """The library's own mark; where it is missing, the objects to blame, of those in the folders."""
+    if is_protected(library):
+        return ""
+    objects = [o for folder in folders for o in sorted(pathlib.Path(folder).rglob("*.o"))]
+    unprotected = " ".join(o.name for o in objects if not is_protected(o))
+    return f"not marked; without protection are: {unprotected or 'none of its objects'}"
 
 
 # --- ABI, bytes, size ----------------------------------------------------------------------------
@@ -173,6 +195,8 @@ def check_abi(objects, update):
 
 
 def check_twins(one, two):
+    if pathlib.Path(one).samefile(two):
+        return f"{two} is the same file, not another build"
     same = pathlib.Path(one).read_bytes() == pathlib.Path(two).read_bytes()
     return "" if same else f"{one} and {two} differ"
 
@@ -216,6 +240,8 @@ def check_sizes(libraries, update):
 
 def pair(text):
     name, _, path = text.partition("=")
+    if not pathlib.Path(path).is_file():
+        raise argparse.ArgumentTypeError(f"'{text}' names no file, as in x86-64=library.so")
     return name, path
 
 
@@ -223,11 +249,13 @@ def main():
     parser = argparse.ArgumentParser(description=__doc__)
     parser.add_argument("--library", action="append", type=pair, required=True,
                         metavar="ARCH=FILE")
-    parser.add_argument("--protected", metavar="DIR",
-                        help="folder of objects that must have AArch64's branch protection")
-    parser.add_argument("--debug-objects", metavar="DIR",
+    parser.add_argument("--protected", required=True, metavar="FILE",
+                        help="AArch64 library of the own objects alone: branch protection")
+    parser.add_argument("--protected-objects", nargs="+", required=True, metavar="DIR",
+                        help="the folders of its objects")
+    parser.add_argument("--debug-objects", required=True, metavar="DIR",
                         help="folder of objects with debug info, for the ABI")
-    parser.add_argument("--twins", nargs=2, action="append", default=[], metavar="FILE",
+    parser.add_argument("--twins", nargs=2, action="append", required=True, metavar="FILE",
                         help="two builds of the same library")
     parser.add_argument("--update", action="store_true", help="commit ABI and sizes as they are")
     parser.add_argument("--summary", help="file to append the row of the final table to")
@@ -237,11 +265,9 @@ def main():
     for arch, library in arguments.library:
         for what, check in LIBRARY_CHECKS.items():
             results.append((f"{arch}: {what}", check(library)))
-    if arguments.protected:
-        results.append(("aarch64: branch protection in every object",
-                        check_branch_protection(arguments.protected)))
-    if arguments.debug_objects:
-        results.append(("ABI as committed", check_abi(arguments.debug_objects, arguments.update)))
+    results.append(("AArch64: branch protection of the own objects, linked",
+                    check_branch_protection(arguments.protected, arguments.protected_objects)))
+    results.append(("ABI as committed", check_abi(arguments.debug_objects, arguments.update)))
     for one, two in arguments.twins:
         results.append((f"same bytes twice: {one}", check_twins(one, two)))
     results.append(("sizes of docs/size.md", check_sizes(arguments.library, arguments.update)))

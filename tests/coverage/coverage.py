@@ -1,8 +1,9 @@
 #!/usr/bin/env python3
 """Checks that the unit tests run every function, line, branch and condition of the library.
 
-Takes a build folder configured with DRAVENTA_COVERAGE, runs its cpp_tests, and lists by file what
-they leave out. Whatever exclusions.txt does not excuse is an error.
+Takes test programs of builds configured with DRAVENTA_COVERAGE, one build for each processor that
+has code of its own. Runs them, and lists by file what they leave out all together. Whatever
+exclusions.txt does not excuse is an error. So is code that none of these builds compiles.
 
 A condition is covered (MC/DC) when two evaluations of its decision differ in their result and,
 among the conditions evaluated in both, in this one alone.
@@ -11,17 +12,19 @@ among the conditions evaluated in both, in this one alone.
 import argparse
 import bisect
 import collections
+import concurrent.futures
 import json
 import os
 import pathlib
 import re
+import shlex
 import subprocess
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
 SOURCE_FOLDERS = ("jni", "render", "selection", "support")
 EXCLUSIONS = pathlib.Path(__file__).with_name("exclusions.txt")
-KINDS = ("functions", "lines", "branches", "conditions")
+KINDS = ("sources", "functions", "lines", "branches", "conditions")
 REPORTED = {"lines": "lines", "branches": "branches", "conditions": "MC/DC"}  # to the summary
 
 # A thing to be covered. `source` is the text of its line, `missing` what has not been seen of it,
@@ -49,6 +52,13 @@ class Source:
     def place(self, line, kind, missing):
         return Place(self.name, line, kind, self.line(line), missing)
 
+    def code(self):
+        """The whole text with blanks for comments, strings and preprocessor lines."""
+        blanked = lambda match: re.sub(r"[^\n]", " ", match.group())
+        text = b"\n".join(self.lines).decode("latin-1")  # one character per byte
+        text = re.sub(r"//.*|/\*[\s\S]*?\*/|\"(\\.|[^\"\\\n])*\"|'(\\.|[^'\\\n])+'", blanked, text)
+        return re.sub(r"^ *#.*(\\\n.*)*", blanked, text, flags=re.MULTILINE)
+
 
 def plain(text):
     return " ".join(text.decode().split())
@@ -57,17 +67,45 @@ def plain(text):
 # --- what the compiler and the run say --------------------------------------------------------
 
 
-def run_tests(program, folder):
-    """Runs the program and returns what llvm-cov exports of it."""
+class Build:
+    """A build for one processor: what it compiles, and what llvm-cov exports of its tests' run."""
+
+    def __init__(self, command):
+        *emulator, program = shlex.split(command)
+        program = pathlib.Path(program).resolve()
+        folder = program.parents[1]
+        self.sources = counted_sources(folder / "compile_commands.json")
+        exported = run_tests([*emulator, program], folder / "coverage")
+        self.functions = exported["functions"]
+        self.files = {file["filename"]: file for file in exported["files"]}
+
+
+def counted_sources(compile_commands):
+    """Names of the sources that a build compiles with counters."""
+    entries = json.loads(compile_commands.read_text())
+    counted = {pathlib.Path(entry["directory"], entry["file"]).resolve() for entry in entries
+               if "-fcoverage-mapping" in shlex.split(entry["command"])}
+    return {str(file.relative_to(ROOT)) for file in counted if file.is_relative_to(ROOT)}
+
+
+def run_tests(command, folder):
+    """Runs a program and returns what llvm-cov exports of it."""
+    program = command[-1]
     folder.mkdir(exist_ok=True)
     for old in folder.glob("*.profraw"):
         old.unlink()
     # %p: a test may start a process of its own.
     environment = dict(os.environ, LLVM_PROFILE_FILE=str(folder / "%p.profraw"))
-    tests = subprocess.run([program, "--gtest_brief=1"], env=environment, text=True,
+    tests = subprocess.run([*command, "--gtest_brief=1"], env=environment, text=True,
                            stdout=subprocess.PIPE, stderr=subprocess.STDOUT)
     if tests.returncode != 0:
         sys.exit(f"{tests.stdout}coverage: {program} failed, so what it covers means nothing")
+    # A test that was skipped or left out covers less, and nothing else would show it.
+    ran = re.search(r"^\[  PASSED  \] ([1-9]\d*) tests?\.$", tests.stdout, re.M)
+    if not ran or "[  SKIPPED ]" in tests.stdout:
+        sys.exit(f"{tests.stdout}coverage: {program} skipped tests or ran none; call it with what "
+                 "they lack")
+    print(f"{ran[1]} tests ran")
     counts = list(folder.glob("*.profraw"))
     if not counts:
         sys.exit(f"coverage: {program} counts nothing; is it built with DRAVENTA_COVERAGE?")
@@ -93,10 +131,7 @@ def function_bodies(source):
     includes, and no function that it has only run itself, for a constant. Reading them off the
     text keeps those from going unnoticed.
     """
-    blanked = lambda match: re.sub(r"[^\n]", " ", match.group())
-    text = b"\n".join(source.lines).decode("latin-1")  # one character per byte
-    text = re.sub(r"//.*|/\*[\s\S]*?\*/|\"(\\.|[^\"\\\n])*\"|'(\\.|[^'\\\n])+'", blanked, text)
-    text = re.sub(r"^ *#.*(\\\n.*)*", blanked, text, flags=re.MULTILINE)
+    text = source.code()
     for brace in re.finditer("{", text):
         before = text[max(brace.start() - 1000, 0) : brace.start()]  # far more than any head
         before = re.sub(r"(\s|\bconst\b|\bnoexcept\b|\bmutable\b|->[\s\w:<>,*&]+)*$", "", before)
@@ -120,16 +155,23 @@ def is_statement_head(before):
     return False
 
 
-def functions(source, exported):
+def regions_of_functions(source, builds):
+    """For each function of a source, in each build: its regions there, and how often it ran."""
+    for build in builds:
+        for function in build.functions:
+            regions = [r for r in function["regions"]
+                       if function["filenames"][r[5]] == str(ROOT / source.name)]
+            if regions:
+                yield regions, function["count"]
+
+
+def functions(source, builds):
     """A place for each function: instantiations of a template, and copies of an inline function
     in several objects, are one."""
     calls = collections.Counter()
     starts = set()
-    for function in exported["functions"]:
-        regions = [r for r in function["regions"]
-                   if function["filenames"][r[5]] == str(ROOT / source.name)]
-        if regions:
-            calls[tuple(regions[0][:2])] += function["count"]
+    for regions, count in regions_of_functions(source, builds):
+        calls[tuple(regions[0][:2])] += count
         starts.update(tuple(r[:2]) for r in regions)
     for (line, _), count in calls.items():
         yield source.place(line, "functions", None if count else "function never called")
@@ -153,53 +195,65 @@ class Segments:
         i = bisect.bisect_right(self.starts, (line, column)) - 1
         return self.segments[i][2] if i >= 0 and self.segments[i][3] else None
 
-    def lines(self):
+    def lines(self, code):
         """For each line with code, how often its most frequent part ran."""
         starting = collections.defaultdict(list)
-        empty = set()  # lines that a comment or nothing begins
         for line, _, count, has_count, is_entry, is_gap in self.segments:
             if has_count and is_entry and not is_gap:
                 starting[line].append(count)
-            elif is_entry and not has_count:
-                empty.add(line)
-        for line in range(1, self.starts[-1][0] + 1) if self.starts else ():
-            # What runs on from the line above.
-            before = None if line in empty else self.count_at(line, 0)
-            counts = starting[line] + ([] if before is None else [before])
-            if counts:
-                yield line, max(counts)
+        for line, text in enumerate(code, 1):
+            if text.strip():
+                # What runs on from the line above.
+                before = self.count_at(line, len(text) - len(text.lstrip()) + 1)
+                counts = starting[line] + ([] if before is None else [before])
+                if counts:
+                    yield line, max(counts)
 
 
-def lines(source, segments):
-    for line, count in segments.lines():
+def lines(source, builds, segments):
+    """A place for each line that some build compiles, and for each that is left out of all."""
+    code = source.code().split("\n")
+    counts = collections.Counter()
+    for in_build in segments:
+        for line, count in in_build.lines(code):
+            counts[line] += count
+    for line, count in sorted(counts.items()):
         yield source.place(line, "lines", None if count else "line never run")
+    inside = {line for regions, _ in regions_of_functions(source, builds)
+              for line in range(regions[0][0], regions[0][2] + 1)}
+    for line in sorted(inside - counts.keys()):
+        if code[line - 1].strip():
+            yield source.place(line, "lines", "line not compiled into any object")
 
 
-def branches(source, segments, exported):
+def branches(source, segments, files):
     """Two places for each condition that something branches on: true and false.
 
     The compiler counts each instantiation of a template by itself. Here a branch is covered when
     it is in one of them: the source has it once, and instantiations differ in what they can reach.
+    So do builds.
     """
     counts = collections.defaultdict(lambda: [0, 0])
-    for *region, true_count, false_count, _, _, _ in exported["branches"]:
-        counts[tuple(region)][0] += true_count
-        counts[tuple(region)][1] += false_count
+    for file in files:
+        for *region, true_count, false_count, _, _, _ in file["branches"]:
+            counts[tuple(region)][0] += true_count
+            counts[tuple(region)][1] += false_count
     for region, (true_count, false_count) in sorted(counts.items()):
-        if true_count == false_count == 0 and segments.count_at(*region[:2]):
+        if true_count == false_count == 0 and any(s.count_at(*region[:2]) for s in segments):
             continue  # the compiler knows the value: a template's constant
         for value, count in (("true", true_count), ("false", false_count)):
             missing = f'branch "{source.text(*region)}" never {value}'
             yield source.place(region[0], "branches", None if count else missing)
 
 
-def conditions(source, exported):
+def conditions(source, files):
     """A place for each condition of a decision with && or ||. As with branches, one instantiation
     is enough; the pair of evaluations has to come from the same one."""
     decisions = collections.defaultdict(list)
-    for *region, _, _, covered in exported["mcdc_records"]:
-        decisions[tuple(region)].append(covered)
-    condition_regions = sorted({tuple(b[:4]) for b in exported["branches"]})
+    for file in files:
+        for *region, _, _, covered in file["mcdc_records"]:
+            decisions[tuple(region)].append(covered)
+    condition_regions = sorted({tuple(b[:4]) for file in files for b in file["branches"]})
     for region, covered in sorted(decisions.items()):
         inside = [c for c in condition_regions if region[:2] <= c[:2] and c[2:] <= region[2:]]
         total = len(covered[0])
@@ -212,14 +266,17 @@ def conditions(source, exported):
             yield source.place(shown[0], "conditions", None if done else missing)
 
 
-def places(source, exported):
-    yield from functions(source, exported)
-    for file in exported["files"]:
-        if file["filename"] == str(ROOT / source.name):
-            segments = Segments(file["segments"])
-            yield from lines(source, segments)
-            yield from branches(source, segments, file)
-            yield from conditions(source, file)
+def places(source, builds):
+    if source.name.endswith(".cpp"):
+        is_compiled = any(source.name in build.sources for build in builds)
+        yield source.place(1, "sources", None if is_compiled else "source not in any counted build")
+    yield from functions(source, builds)
+    path = str(ROOT / source.name)
+    files = [build.files[path] for build in builds if path in build.files]
+    segments = [Segments(file["segments"]) for file in files]
+    yield from lines(source, builds, segments)
+    yield from branches(source, segments, files)
+    yield from conditions(source, files)
 
 
 # --- exclusions ---------------------------------------------------------------------------------
@@ -301,15 +358,19 @@ def append_summary(path, totals, excluded):
 
 def main():
     parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
-    parser.add_argument("build", type=pathlib.Path, help="build folder with DRAVENTA_COVERAGE")
+    parser.add_argument("programs", nargs="+", metavar="PROGRAM",
+                        help="BUILD/tests/PROGRAM with DRAVENTA_COVERAGE; before it its emulator")
     parser.add_argument("--summary", metavar="FILE", help="append the totals to FILE, with tabs")
     arguments = parser.parse_args()
 
-    build = arguments.build.resolve()
-    exported = run_tests(build / "tests/cpp_tests", build / "coverage")
-    by_file = {name: list(places(Source(name), exported)) for name in sources()}
+    with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
+        builds = list(pool.map(Build, arguments.programs))
+    by_file = {name: list(places(Source(name), builds)) for name in sources()}
     everything = [place for file_places in by_file.values() for place in file_places]
     totals = count(everything)
+    if not all(total for _, total in totals.values()):
+        sys.exit(f"coverage: nothing was counted of {', '.join(SOURCE_FOLDERS)} ({totals}); is "
+                 f"{build} a build of {ROOT}?")
     tables = {name: count(file_places) for name, file_places in by_file.items() if file_places}
     print_table({**tables, "all": totals})
 

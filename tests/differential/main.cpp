@@ -7,6 +7,7 @@
 // With --digests it prints a digest of all that the library gave in a fixed number of cases: the
 // same on every machine, with every compiler, wherever the buffers lie.
 
+#include <cerrno>
 #include <chrono>
 #include <cinttypes>
 #include <cstdio>
@@ -33,6 +34,8 @@ constexpr char USAGE[] =
     "  --digests SIZE the digest of each family, of as many cases as are committed; short: of a\n"
     "                 sixteenth\n";
 
+constexpr uint64_t MOST = 1000000000;
+
 struct options {
     double seconds = 10;
     uint64_t cases = 0;
@@ -57,9 +60,23 @@ struct run_state {
 }
 
 uint64_t number(const char* option, const char* text) {
+    // strtoull would take a sign, and blanks before it.
+    const bool starts_with_digit = text && *text >= '0' && *text <= '9';
     char* end = nullptr;
-    const uint64_t value = text ? std::strtoull(text, &end, 0) : 0;
-    if (!text || end == text || *end) refuse(std::string(option) + " takes a whole number");
+    errno = 0;
+    const uint64_t value = starts_with_digit ? std::strtoull(text, &end, 0) : 0;
+    if (!starts_with_digit || *end || errno == ERANGE) {
+        refuse(std::string(option) + " takes a whole number");
+    }
+    return value;
+}
+
+// A number of seconds or cases: with none, nothing would be compared.
+uint64_t amount(const char* option, const char* text) {
+    const uint64_t value = number(option, text);
+    if (value < 1 || value > MOST) {
+        refuse(std::string(option) + " takes a number from 1 to " + std::to_string(MOST));
+    }
     return value;
 }
 
@@ -69,9 +86,9 @@ options read_options(int count, char** arguments) {
         const std::string option = arguments[i];
         const char* value = i + 1 < count ? arguments[i + 1] : nullptr;
         if (option == "--seconds") {
-            o.seconds = static_cast<double>(number("--seconds", value));
+            o.seconds = static_cast<double>(amount("--seconds", value));
         } else if (option == "--cases") {
-            o.cases = number("--cases", value);
+            o.cases = amount("--cases", value);
         } else if (option == "--seed") {
             o.seed = number("--seed", value);
         } else if (option == "--case") {
@@ -207,6 +224,20 @@ void print_table(const std::vector<run_state>& runs) {
     }
 }
 
+// The line that ./dev differential puts into its table. Ends the program when a family ran no case.
+void print_verdict(const std::vector<run_state>& runs) {
+    uint64_t cases = 0;
+    for (const run_state& run : runs) {
+        if (run.cases == 0) {
+            std::printf("no case of family %s was compared\n", run.f->name);
+            std::exit(1);
+        }
+        cases += run.cases;
+    }
+    std::printf("0 differences in %" PRIu64 " %s of %zu %s\n", cases, cases == 1 ? "case" : "cases",
+                runs.size(), runs.size() == 1 ? "family" : "families");
+}
+
 }  // namespace
 
 int main(int count, char** arguments) {
@@ -220,7 +251,7 @@ int main(int count, char** arguments) {
     if (o.single) {
         run_case(&runs.front(), o.single_seed);
         print_seen(runs.front());
-        std::printf("no difference\n");
+        print_verdict(runs);
         return 0;
     }
 
@@ -228,9 +259,11 @@ int main(int count, char** arguments) {
     std::printf("comparing with the models for %.0f seconds, seed %" PRIu64 "\n", o.seconds,
                 o.seed);
     const int rounds = 4;
+    double shares = 0;
+    for (const run_state& run : runs) shares += run.f->share;
     for (int round = 1; round <= rounds; ++round) {
         for (run_state& run : runs) {
-            run_for(&run, o, o.seconds / rounds / static_cast<double>(runs.size()));
+            run_for(&run, o, o.seconds / rounds * run.f->share / shares);
         }
         std::printf("round %d of %d: no difference so far\n", round, rounds);
     }
@@ -238,5 +271,5 @@ int main(int count, char** arguments) {
         while (run.cases < o.cases) run_for(&run, o, 1);
     }
     print_table(runs);
-    std::printf("0 differences\n");
+    print_verdict(runs);
 }

@@ -129,5 +129,5 @@ void run_session(random_source& random, findings* found) {
 
 const std::vector<family> session_families = {
     {"session", "strokes, brushes, ROI calls, inversions and resets, compared after each", 16000,
-     run_session},
+     run_session, RARE_FAULTS},
 };

@@ -1,8 +1,9 @@
 #!/usr/bin/env python3
-"""Checks the project's pages: their links, and the pictures of docs/operations.
+"""Checks the project's pages: their links, whose their pictures are, and those of docs/operations.
 
-Those pictures are what the player makes of the scripts beside them, to the last byte. --update puts
-them there anew. Exits with 1 and a line for each thing that is wrong.
+Every picture is listed in desktop/photos/ATTRIBUTION.md, as made from a photo or as without one.
+The pictures of docs/operations are what the player makes of the scripts beside them, to the last
+byte; --update puts them there anew. Exits with 1 and a line for each thing that is wrong.
 """
 
 import argparse
@@ -12,7 +13,7 @@ import sys
 import tempfile
 
 sys.dont_write_bytecode = True
-from pages import ROOT, dead_links, pages  # noqa: E402
+from pages import LINK, ROOT, dead_links, pages, unattributed_pictures  # noqa: E402
 
 PLAYER = ROOT / "build/release/desktop/player"
 OPERATIONS = ROOT / "docs/operations"
@@ -36,6 +37,8 @@ def main():
         name = page.relative_to(ROOT)
         wrong += [f"{name}: nothing is at {target}; mend the link" for target in dead_links(page)]
 
+    wrong += unattributed_pictures()
+
     with tempfile.TemporaryDirectory() as name:
         folder = type(ROOT)(name)
         drawn = drawn_pictures(folder)
@@ -51,6 +54,8 @@ def main():
                          "./dev docs --update draws it anew")
     if not drawn:
         wrong.append("docs/operations: no script draws a picture")
+    if not any(LINK.search(page.read_text(encoding="utf-8")) for page in pages()):
+        wrong.append("no page has a link, so none was checked; is this a checkout of the project?")
 
     print(f"{len(pages())} pages, {len(drawn)} pictures, {len(wrong)} wrong")
     for line in wrong:

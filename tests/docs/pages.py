@@ -1,10 +1,14 @@
-"""The project's pages: what they link to, and the commands that they show."""
+"""The project's pages: what they link to, their pictures, and the commands that they show."""
 
+import collections
 import pathlib
 import re
 import subprocess
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
+
+ATTRIBUTION = ROOT / "desktop/photos/ATTRIBUTION.md"
+PICTURE_ENDINGS = (".png", ".jpg", ".jpeg", ".svg", ".gif", ".webp", ".bmp", ".tif", ".tiff", ".ico")
 
 LINK = re.compile(r"!?\[[^\]]*\]\(([^)\s]+)\)")
 FENCE = re.compile(r"^```\w*\n(.*?)^```$", re.M | re.S)
@@ -12,11 +16,37 @@ INLINE = re.compile(r"`((?:\./dev|cmake|ctest|grep|git) [^`]+)`")
 SHOWN_COMMAND = re.compile(r"^(?:\./dev|cmake|ctest|grep|git)\b.*", re.M)
 
 
+def project_files():
+    """The path from the root of every file of the project that is there."""
+    listed = subprocess.run(["git", "ls-files", "--cached", "--others", "--exclude-standard", "-z"],
+                            cwd=ROOT, check=True, capture_output=True, text=True).stdout
+    return [name for name in listed.split("\0") if (ROOT / name).is_file()]
+
+
 def pages():
     """Every Markdown page of the project."""
-    listed = subprocess.run(["git", "ls-files", "--cached", "--others", "--exclude-standard", "*.md"],
-                            cwd=ROOT, check=True, capture_output=True, text=True).stdout
-    return [ROOT / name for name in listed.split()]
+    return [ROOT / name for name in project_files() if name.endswith(".md")]
+
+
+def pictures():
+    """Every picture of the project, by its path from the root."""
+    return [name for name in project_files() if name.lower().endswith(PICTURE_ENDINGS)]
+
+
+def unattributed_pictures():
+    """What is wrong with the list of pictures, a line for each."""
+    text = ATTRIBUTION.read_text(encoding="utf-8")
+    rows = [[cell.strip() for cell in row.strip("|").split("|")]
+            for row in re.findall(r"^\|.*\|$", text, re.M)]
+    listed = collections.Counter(row[0].strip("`") for row in rows if row[0].startswith("`"))
+    wrong = [f"{row[0]}: a column is empty" for row in rows if "" in row]
+    wrong += [f"{name}: {count} times in the list" for name, count in listed.items() if count > 1]
+    wrong += [f"{name}: not listed as made from a photo, nor as without one"
+              for name in pictures() if name not in listed]
+    wrong += [f"{name}: listed and not there" for name in listed if name not in pictures()]
+    if not listed:
+        wrong.append("no picture is listed")
+    return [f"{ATTRIBUTION.relative_to(ROOT)}: {line}" for line in wrong]
 
 
 def dead_links(page):

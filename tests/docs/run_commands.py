@@ -1,8 +1,8 @@
 #!/usr/bin/env python3
-"""Runs the commands that the project's pages show, but for those that .ci/run runs anyway.
+"""Runs the commands that the project's pages show, but for those that .ci/run or ./dev weekly runs.
 
-A command counts as run by .ci/run when it has the same verb of ./dev and no option that the line
-there lacks. What would take too long as it stands is run in a form of its own; SHORTER says in which
+A command counts as run there when it has the same verb of ./dev and no option that the line there
+lacks. What would take too long as it stands is run in a form of its own; SHORTER says in which
 and why. Exits with 1 when a command fails.
 """
 
@@ -36,26 +36,36 @@ def options(command):
     return {word for word in shlex.split(command) if word.startswith("--")}
 
 
-def run_by_ci(command, ci_lines):
+def regular_commands():
+    """The lines of .ci/run, and those of ./dev weekly with itself."""
+    ci = re.findall(r"^(\./dev .*)", (ROOT / ".ci/run").read_text(encoding="utf-8"), re.M)
+    weekly = re.findall(r"^    (\./dev .*) \|\| ", (ROOT / "dev").read_text(encoding="utf-8"), re.M)
+    for lines, place in ((ci, ".ci/run"), (weekly, "the weekly command of dev")):
+        if not lines:
+            sys.exit(f"no command was found in {place}, expected lines ./dev COMMAND")
+    return [*ci, *weekly, "./dev weekly"]
+
+
+def runs_regularly(command, regular):
     return any(shlex.split(line)[:2] == shlex.split(command)[:2] and
-               options(command) <= options(line) for line in ci_lines)
+               options(command) <= options(line) for line in regular)
 
 
 def shortened(command):
     for beginning, other in SHORTER.items():
         if command.startswith(beginning):
             command = other
-    return re.sub(r"--seconds \d+", "--seconds 1", command)
+    return re.sub(r"--seconds \d+", "--seconds 8", command)
 
 
 def main():
-    ci_lines = re.findall(r"^\./dev .*", (ROOT / ".ci/run").read_text(encoding="utf-8"), re.M)
+    regular = regular_commands()
     done = set()
     failed = []
     for command, page in commands().items():
         form = shortened(command)
-        if run_by_ci(form, ci_lines):
-            print(f"{page}: {command}: run by .ci/run", flush=True)
+        if runs_regularly(form, regular):
+            print(f"{page}: {command}: run by .ci/run or ./dev weekly", flush=True)
             continue
         print(f"{page}: {command}: running {'it' if form == command else form}", flush=True)
         if form in done:

@@ -5,6 +5,9 @@
 
 #include <cstddef>
 
+// Why `data()` is null: to be said by a test that asserts it is not.
+constexpr char NO_ROOM[] = "too little address space: call again after 'ulimit -v unlimited'";
+
 template <class T>
 class sparse_array {
 public:

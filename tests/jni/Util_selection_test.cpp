@@ -455,6 +455,20 @@ TEST_P(Util_selection_arrays, UpdateObjectROIPinsScansAndReleases) {
     EXPECT_EQ(mask.times_copied_back(), one_copy());
 }
 
+TEST_P(Util_selection_arrays, UpdateObjectROIReadsAllRowsOfAnUprightMask) {
+    g_object_boundary = {0, 1, 0, 3};
+    fake_bytes mask("mask", Picture(R"(
+        ..
+        ..
+        ..
+        .#)")
+                                .cells);
+
+    UTIL_METHOD(update_1objectROI)(&env, nullptr, mask, 2, 4);
+
+    EXPECT_EQ(g_object_boundary, (ze_rect{1, 1, 3, 3}));
+}
+
 TEST_F(Util_selection, ResetFillROISetsTheFillBoxWithoutTouchingJava) {
     UTIL_METHOD(reset_1fill_1ROI)(&env, nullptr, 640, 480);
 

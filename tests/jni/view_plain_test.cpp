@@ -14,6 +14,7 @@
 #include "jni/view_image.h"
 #include "jni/view_outline.h"
 #include "tests/differential/random_source.h"
+#include "tests/helpers/block_edges.h"
 #include "tests/helpers/guarded_buffer.h"
 #include "tests/helpers/rect_printing.h"
 
@@ -194,6 +195,100 @@ TEST(view_plain, EqualsTheFastLoopsOnStretchesOfOneValueAtAnyScale) {
     }
 }
 
+namespace {
+
+// A photo of three rows under a mask of one value but for a pixel in column x of the middle row,
+// drawn whole.
+drawing with_lone_pixel(int width, int x, float scale, uint8_t lone) {
+    const int view_width = static_cast<int>(static_cast<float>(width) / scale);
+    const int view_height = static_cast<int>(3 / scale) + 1;
+    drawing d = {view_width, view_height, width, 3, scale, 0, 0, {}, {}, {}};
+    d.area = {0, view_width - 1, 0, view_height - 1};
+    for (int i = 0; i < 3 * width; ++i) d.photo.push_back(i);
+    d.mask.assign(d.photo.size(), static_cast<uint8_t>(1 - lone));
+    d.mask[static_cast<size_t>(width + x)] = lone;
+    return d;
+}
+
+}  // namespace
+
+TEST(view_plain, EqualsTheFastLoopsOnASinglePixelInEveryColumn) {
+    for (const int width : LENGTHS_AROUND_BLOCKS) {
+        for (const int x : places_in(width)) {
+            for (const float scale : {0.5f, 0.8f, 1.0f}) {
+                for (const uint8_t lone : {0, 1}) {
+                    compare(with_lone_pixel(width, x, scale, lone), guard::BEHIND);
+                    ASSERT_FALSE(HasFailure()) << int{lone} << " in column " << x;
+                }
+            }
+        }
+    }
+}
+
+TEST(view_plain, EqualsTheFastLoopsOnASinglePixelWhereTilesMeet) {
+    for (const int width : {TILE, TILE + 1, TILE + 2, 2 * TILE + 2}) {
+        for (const int from_edge : {-3, -2, -1, 0, 1, 2}) {
+            for (const float scale : {0.5f, 1.0f}) {
+                const int x = static_cast<int>(TILE * scale) + from_edge;
+                if (x >= width) continue;
+                for (const uint8_t lone : {0, 1}) {
+                    compare(with_lone_pixel(width, x, scale, lone), guard::BEHIND);
+                    ASSERT_FALSE(HasFailure()) << int{lone} << " in column " << x;
+                }
+            }
+        }
+    }
+}
+
+// The view shows photo rows -1, 1, 3, 5 and 7 of 7: what lies beyond the photo is no neighbour.
+TEST(view_plain, EqualsTheFastLoopsWhereARowAboveOrBelowLiesBeyondThePhoto) {
+    constexpr int SIDE = 7;
+    drawing d = {5, 5, SIDE, SIDE, 2.0f, 0, -1, {0, 4, 0, 4}, {}, {}};
+    for (int i = 0; i < SIDE * SIDE; ++i) d.photo.push_back(i);
+    for (const int unselected_row : {0, 1, 3, 5, 6}) {
+        d.mask.assign(SIDE * SIDE, 1);
+        std::fill_n(d.mask.begin() + unselected_row * SIDE, SIDE, 0);
+        for (const int offset_x : {-1, 0, 1}) {
+            d.offset_x = offset_x;
+            compare(d, guard::BEHIND);
+        }
+    }
+}
+
+// A photo with columns where positions end: those of the last neighbour wrap first.
+TEST(view_plain, EqualsTheFastLoopsInAPhotoAsWideAsPositionsReach) {
+    constexpr int WIDTH = 32770, HEIGHT = 4;
+    drawing d = {12, HEIGHT, WIDTH, HEIGHT, 1.0f, 0, 0, {0, 11, 0, HEIGHT - 1}, {}, {}};
+    for (int i = 0; i < WIDTH * HEIGHT; ++i) d.photo.push_back(i);
+    d.mask.assign(d.photo.size(), 1);
+    for (size_t i = 0; i < d.mask.size(); i += 3) d.mask[i] = 0;
+    for (int from_last = 0; from_last < 5; ++from_last) {
+        d.scale = 1.0f;
+        d.offset_x = 32754 + from_last;
+        compare(d, guard::BEHIND);
+        d.scale = 0.5f;
+        d.offset_x = 32759 + from_last;
+        compare(d, guard::BEHIND);
+    }
+}
+
+TEST(view_plain, EqualsTheFastLoopsWherePositionsBeginToWrap) {
+    for (const float scale : {0.5f, 1.0f, 1.5f}) {
+        for (int offset = 32755; offset <= 32767 && !HasFailure(); ++offset) {
+            for (const int photo_width : {1, 9}) {
+                drawing d = {12, 4, photo_width, 4, scale, offset, 0, {0, 11, 0, 3}, {}, {}};
+                for (int i = 0; i < 4 * photo_width; ++i) d.photo.push_back(i);
+                d.mask.assign(d.photo.size(), 1);
+                d.mask[d.mask.size() / 2] = 0;
+                compare(d, guard::BEHIND);
+                d.offset_x = 0;
+                d.offset_y = offset;
+                compare(d, guard::BEHIND);
+            }
+        }
+    }
+}
+
 // Pixels drawn earlier are then the photo of later ones.
 TEST(view_plain, EqualsTheFastLoopsWhereThePhotoIsTheView) {
     for (int view_width = 1; view_width <= 6; ++view_width) {
@@ -213,21 +308,27 @@ TEST(view_plain, EqualsTheFastLoopsWhereThePhotoIsTheView) {
                                photo_pixels{plain_drawn.data(), photo_width, height});
                     EXPECT_EQ(drawn, plain_drawn);
                 };
-                both([&](auto v, auto p) { draw_image(v, p, 0.5f, 1, 0, area); },
-                     [&](auto v, auto p) { plain::draw_image(v, p, 0.5f, 1, 0, area); });
+                // From offset 2 on, a row drawn onto itself and drawn again moves on once more.
+                for (const int offset : {1, 2, 3}) {
+                    both([&](auto v, auto p) { draw_image(v, p, 0.5f, offset, 0, area); },
+                         [&](auto v, auto p) { plain::draw_image(v, p, 0.5f, offset, 0, area); });
+                }
                 both([&](auto v, auto p) { draw_small_image(v, p, area); },
                      [&](auto v, auto p) { plain::draw_small_image(v, p, area); });
                 const std::vector<uint8_t> mask(36, 1);
                 const auto outlined = [&](const photo_pixels& p) {
                     return outlined_photo{p, mask.data()};
                 };
-                both(
-                    [&](auto v, auto p) {
-                        draw_image_with_outline(v, outlined(p), 0.5f, 1, 0, DASHES, area);
-                    },
-                    [&](auto v, auto p) {
-                        plain::draw_image_with_outline(v, outlined(p), 0.5f, 1, 0, DASHES, area);
-                    });
+                for (const int offset : {1, 2, 3}) {
+                    both(
+                        [&](auto v, auto p) {
+                            draw_image_with_outline(v, outlined(p), 0.5f, offset, 0, DASHES, area);
+                        },
+                        [&](auto v, auto p) {
+                            plain::draw_image_with_outline(v, outlined(p), 0.5f, offset, 0, DASHES,
+                                                           area);
+                        });
+                }
                 both([&](auto v,
                          auto p) { draw_small_image_with_outline(v, outlined(p), DASHES, area); },
                      [&](auto v, auto p) {

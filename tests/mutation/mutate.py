@@ -1,76 +1,89 @@
 #!/usr/bin/env python3
-"""Mutation testing: would the tests notice a small mistake in the library?
+"""Mutation testing: would the tests notice a small mistake in the library or the Java classes?
 
 Each mutant is the library with one small deviation in one source: `<` for `<=`, a constant off by
-one, left for right, a statement left out. A copy of the sources is built with it, and the tests
-run, the quickest first, until one fails:
+one, left for right, a statement left out. It is built and tested, with the quickest tests first,
+until one fails; cpp.py and java.py say how. Limits are processor time, so that a busy machine changes nothing.
 
-  unit tests     cpp_tests in one process
-  differential   a short comparison with the slow models
-  sanitized      the unit tests once more, with AddressSanitizer and UndefinedBehaviorSanitizer
-
-A mutant that none of them notices has survived: either a test is missing, or no caller could tell
-the mutant from the library. The latter are listed with their reasons in survivors.txt. Mutants that
-do not compile do not count, nor do those whose object files are the original's ("same code").
+A mutant that no test notices has survived: either a test is missing, or no caller could tell the
+mutant from the library. The latter are listed with their reasons in survivors.txt. Mutants that do
+not compile do not count, nor do those whose objects are the original's ("same code"). One that
+"hung" took longer than its limit, and counts as survived; it is "hung, proven" and killed when the
+test in which it hung takes 1,000 times as long as without it, and 20 seconds at least.
 
 The standard set is a part of all mutants that covers every file; --all takes all, --rest those
-outside the standard set. Exits with 1 when a survivor is not explained, or an explanation no longer
-fits. The tree that holds this script is read only; everything is written under --work.
+outside the standard set. Results are kept in results.tsv under --work, and --resume takes what still
+holds from there; results.py says when. --report makes docs/mutation.md of them. Exits with 1 when a survivor is not explained, or an
+explanation no longer fits. The tree that holds this script is read only; everything is written under
+--work.
 """
 
 import argparse
 import collections
+import fcntl
 import fnmatch
-import hashlib
-import os
 import pathlib
 import queue
 import random
 import re
-import resource
-import shutil
-import signal
-import subprocess
 import sys
 import threading
 import time
 
 sys.dont_write_bytecode = True  # the tree is read only
-from mutants import FOLDERS, ROOT, all_mutants, description, key, library_files, plain
-from mutants import standard_set, title
+import cpp
+import java
+import report
+from mutants import LEFT_FOR_LATER, NO_TEST, PROCESSORS, ROOT, all_mutants, description, key, plain
+from mutants import processor_of, standard_set, title
+from results import ALIVE, KILLED, Results, state
+from steps import StepFailed
 
 SURVIVORS = pathlib.Path(__file__).resolve().parent / "survivors.txt"
-COPIED = FOLDERS + ["cmake", "tests", "CMakeLists.txt", "draventaUtil.h", "exports.txt"]
-
-UNIT_SECONDS = 20
-DIFFERENTIAL_SECONDS = 3
-SANITIZED_SECONDS = 60
-MEMORY_LIMIT = 4 << 30
+HOLDS = {  # what a line 'holds:' may say, and for which of PROCESSORS it is true
+    "": {"x86-64", "AArch64", "s390x"},
+    "64-bit": {"x86-64", "AArch64", "s390x"},
+    "little-endian": {"x86-64", "AArch64"},
+    "x86-64": {"x86-64"},
+    "AArch64": {"AArch64"},
+    "big-endian": {"s390x"},
+}
 CHUNK = 20  # mutants that a worker takes at a time
 
 # --- explained survivors --------------------------------------------------------------------------
 
 
+class Explanation:
+    """Why a mutant makes no difference, and on which processors."""
+
+    def __init__(self):
+        self.reason = ""
+        self.holds = ""
+
+    def on(self, processor):
+        return processor in HOLDS[self.holds]
+
+
 def read_survivors(path):
-    """Explained survivors, by key. survivors.txt says how it is written."""
+    """Explanations by key. survivors.txt says how it is written."""
     explained = {}
     place = None
     changes = []  # that share the next reason
-    reason = ""
+    explanation = Explanation()
 
     def keep():
         for change in changes:
-            explained[place + (change,)] = reason
-        if changes and not reason:
+            explained[place + (change,)] = explanation
+        if changes and not explanation.reason:
             sys.exit(f"{path}: no reason for {changes[-1]} in {place[0]}: {place[2]}")
 
     for number, line in enumerate(path.read_text().split("\n"), 1):
         indent = len(line) - len(line.lstrip())
         if not line.strip() or line.startswith("#"):
             continue
-        if indent < 4 and reason:
+        if indent < 4 and (explanation.reason or explanation.holds):
             keep()
-            changes, reason = [], ""
+            changes, explanation = [], Explanation()
         if indent == 0:
             keep()
             match = re.fullmatch(r"([^:@]+)(?:@(\d+))?: (.*)", line)
@@ -79,210 +92,19 @@ def read_survivors(path):
             place = (match[1], int(match[2] or 1), plain(match[3]))
         elif indent == 2:
             changes.append(plain(line))
+        elif line.strip().startswith("holds: "):
+            explanation.holds = line.strip().removeprefix("holds: ")
+            if explanation.holds not in HOLDS:
+                sys.exit(f"{path}:{number}: '{explanation.holds}' is none of {list(HOLDS)[1:]}")
         else:
-            reason = plain(reason + " " + line)
+            explanation.reason = plain(explanation.reason + " " + line)
     keep()
     return explained
 
 
-# --- building and testing -------------------------------------------------------------------------
-
-# A changed header means most tests anew. Precompiled headers make that quicker, and a small program
-# with the tests of that header alone, made first, mostly saves it.
-CMAKE_EXTRA = """
-cmake_language(DEFER CALL target_precompile_headers cpp_tests PRIVATE
-               <gmock/gmock.h> <gtest/gtest.h>)
-
-function(add_header_tests stem)
-  find_package(GTest REQUIRED)
-  file(GLOB helpers ${PROJECT_SOURCE_DIR}/tests/helpers/*.cpp)
-  list(TRANSFORM ARGN PREPEND ${PROJECT_SOURCE_DIR}/ OUTPUT_VARIABLE tests)
-  add_executable(${stem}_tests EXCLUDE_FROM_ALL ${tests} ${helpers})
-  target_compile_options(${stem}_tests PRIVATE -O0)
-  target_link_libraries(${stem}_tests PRIVATE draventa_core counted_allocations GTest::gmock
-                        GTest::gtest_main)
-endfunction()
-"""
-
-TESTS_OF_HEADERS = {  # those that have no test of their own name
-    "jni/java_access.h": ["tests/jni/Util_drawing_test.cpp", "tests/jni/Util_selection_test.cpp"],
-    "selection/lasso_values.h": ["tests/selection/lasso_segment_test.cpp",
-                                 "tests/selection/region_fill_lasso_test.cpp"],
-}
-
-
-def header_tests():
-    """Header -> test sources that name it first."""
-    found = dict(TESTS_OF_HEADERS)
-    for file in library_files():
-        test = f"tests/{file[:-2]}_test.cpp"
-        if file.endswith(".h") and (ROOT / test).exists():
-            found[file] = [test]
-    return found
-
-
-def cmake_extra():
-    calls = (f"cmake_language(DEFER CALL add_header_tests {pathlib.Path(header).stem} "
-             f"{' '.join(tests)})\n" for header, tests in header_tests().items())
-    return CMAKE_EXTRA + "".join(calls)
-
-
-BUILDS = {  # folder -> CMake arguments
-    "plain": ["-DCMAKE_CXX_FLAGS=-O1 -Werror=return-type"],
-    "sanitized": ["-DCMAKE_CXX_FLAGS=-O1 -Werror=return-type",
-                  "-DDRAVENTA_SANITIZERS=address,undefined,float-cast-overflow"],
-}
-
-ENVIRONMENT = dict(os.environ, ASAN_OPTIONS="allocator_may_return_null=1",
-                   UBSAN_OPTIONS="halt_on_error=1")
-
-
-class StepFailed(Exception):
-    """A step that has to succeed did not."""
-
-
-def resident_bytes(pid):
-    """Memory that a process occupies, 0 once it has ended."""
-    try:
-        pages = pathlib.Path(f"/proc/{pid}/statm").read_text().split()[1]
-    except (OSError, IndexError):
-        return 0
-    return int(pages) * os.sysconf("SC_PAGE_SIZE")
-
-
-def run(command, seconds):
-    """Runs a command in a process group of its own.
-
-    True, False, or None when time ran out. One that takes all memory has failed; the address space
-    says nothing, since some tests map sparse gigabytes.
-    """
-    def limit_time():  # for the case that this script ends before the command
-        resource.setrlimit(resource.RLIMIT_CPU, (seconds + 1, seconds + 1))
-
-    process = subprocess.Popen(command, stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL,
-                               stderr=subprocess.DEVNULL, env=ENVIRONMENT, preexec_fn=limit_time,
-                               start_new_session=True)
-    end = time.monotonic() + seconds
-    try:
-        while time.monotonic() < end:
-            try:
-                return process.wait(0.25) == 0
-            except subprocess.TimeoutExpired:
-                if resident_bytes(process.pid) > MEMORY_LIMIT:
-                    return False
-        return None
-    finally:
-        if process.poll() is None:
-            os.killpg(process.pid, signal.SIGKILL)
-            process.wait()
-
-
-class Workshop:
-    """A copy of the sources with its build folders, for one mutant after the other."""
-
-    def __init__(self, folder):
-        self.source = folder / "source"
-        self.builds = {name: folder / name for name in BUILDS}
-        self.mutated = None
-
-    def prepare(self):
-        """Copies, builds and tests the library as it is."""
-        for name in COPIED:
-            self.copy(name)
-        extra = self.source.parent / "extra.cmake"
-        if not extra.exists() or extra.read_text() != cmake_extra():
-            extra.write_text(cmake_extra())
-        for name, build in self.builds.items():
-            command = ["cmake", "-S", self.source, "-B", build, "-G", "Ninja",
-                       "-DDRAVENTA_JAVA=OFF", f"-DCMAKE_PROJECT_INCLUDE={extra}", *BUILDS[name]]
-            if not run(command, 120) or not self.build(name, "cpp_tests"):
-                raise StepFailed(f"building {build} failed")
-        if not self.build("plain", "differential"):
-            raise StepFailed("building the differential program failed")
-        for stage, test in self.stages():
-            if not test():
-                raise StepFailed(f"{stage}: not green without a mutant")
-        self.original = {scope: self.objects(scope) for scope in ("draventa_core", "cpp_tests")}
-
-    def copy(self, name):
-        """Brings one file or folder of the copy up to date; what is equal keeps its time stamp."""
-        paths = sorted((ROOT / name).rglob("*")) if (ROOT / name).is_dir() else [ROOT / name]
-        files = {p.relative_to(ROOT) for p in paths if p.is_file()}
-        present = (self.source / name).rglob("*") if (self.source / name).is_dir() else []
-        for old in [p for p in present if p.is_file()]:
-            if old.relative_to(self.source) not in files:
-                old.unlink()
-        for file in files:
-            target = self.source / file
-            content = (ROOT / file).read_bytes()
-            if not target.exists() or target.read_bytes() != content:
-                target.parent.mkdir(parents=True, exist_ok=True)
-                target.write_bytes(content)
-
-    def build(self, name, target):
-        return run(["ninja", "-C", self.builds[name], "-j1", target], 600)
-
-    def objects(self, scope):
-        """Digests of the object files of a target."""
-        files = sorted(self.builds["plain"].rglob(f"{scope}.dir/**/*.o"))
-        return [hashlib.sha256(f.read_bytes()).digest() for f in files]
-
-    def mutate(self, mutant):
-        """Puts the mutant in place of the one before."""
-        if self.mutated not in (None, mutant.file):
-            shutil.copyfile(ROOT / self.mutated, self.source / self.mutated)
-        text = (ROOT / mutant.file).read_text()
-        changed = text[:mutant.start] + mutant.replacement + text[mutant.end:]
-        (self.source / mutant.file).write_text(changed)
-        self.mutated = mutant.file
-
-    def stages(self):
-        """The tests in their order, each with what builds and runs it."""
-        unit = ["--gtest_brief=1", "--gtest_fail_fast"]
-        plain_build, sanitized = self.builds["plain"], self.builds["sanitized"]
-
-        def unit_tests():
-            return run([plain_build / "tests/cpp_tests", *unit], UNIT_SECONDS)
-
-        def differential():
-            program = plain_build / "tests/differential/differential"
-            return self.build("plain", "differential") and run(
-                [program, "--seconds", str(DIFFERENTIAL_SECONDS)], 20 * DIFFERENTIAL_SECONDS)
-
-        def sanitized_tests():
-            return self.build("sanitized", "cpp_tests") and run(
-                [sanitized / "tests/cpp_tests", *unit], SANITIZED_SECONDS)
-
-        return [("unit tests", unit_tests), ("differential", differential),
-                ("sanitized", sanitized_tests)]
-
-    def header_tests_pass(self, header):
-        """False when the tests of this header alone notice its mutant; True decides nothing."""
-        target = pathlib.Path(header).stem + "_tests"
-        return not self.build("plain", target) or run(
-            [self.builds["plain"] / target, "--gtest_brief=1"], UNIT_SECONDS) is not False
-
-    def fate(self, mutant):
-        """'does not compile', 'same code', 'hung', 'survived', or the stage that noticed."""
-        self.mutate(mutant)
-        if not self.build("plain", "draventa_core"):
-            return "does not compile"
-        same_library = self.objects("draventa_core") == self.original["draventa_core"]
-        if same_library and mutant.file.endswith(".cpp"):
-            return "same code"
-        if mutant.file in header_tests() and not self.header_tests_pass(mutant.file):
-            return "unit tests"
-        if not self.build("plain", "cpp_tests"):
-            return "does not compile"
-        if same_library and self.objects("cpp_tests") == self.original["cpp_tests"]:
-            return "same code"
-        for stage, test in self.stages():
-            noticed = test()
-            if noticed is None:
-                return "hung"
-            if not noticed:
-                return stage
-        return "survived"
+def explains(explained, mutant):
+    """Whether a mutant is explained for the processor that it runs on."""
+    return key(mutant) in explained and explained[key(mutant)].on(processor_of(mutant))
 
 
 # --- the run --------------------------------------------------------------------------------------
@@ -291,11 +113,14 @@ class Workshop:
 class Run:
     """All chosen mutants, spread over workers."""
 
-    def __init__(self, mutants, work, workers):
+    def __init__(self, mutants, results, work, workers, minutes):
         self.mutants = mutants
+        self.results = results
         self.work = work
         self.workers = workers
-        self.fates = {}
+        self.end = time.monotonic() + 60 * minutes
+        self.rows = {}  # mutant -> row
+        self.seconds = 0
         self.errors = []
         self.lock = threading.Lock()
         self.chunks = queue.Queue()
@@ -303,60 +128,78 @@ class Run:
             self.chunks.put(chunk)
 
     def in_chunks(self):
-        """Mutants of one file together, since going on to another file means a rebuild of both.
-        Headers come last, because they take longest."""
+        """Mutants of one file together. Headers and what is emulated come late, since they take long;
+        last what ran before, of which most will survive again."""
         groups = collections.defaultdict(list)
         for mutant in self.mutants:
-            groups[mutant.file].append(mutant)
-        for file in sorted(groups, key=lambda f: (f.endswith(".h"), f)):
-            for i in range(0, len(groups[file]), CHUNK):
-                yield groups[file][i:i + CHUNK]
+            emulated = list(PROCESSORS).index(processor_of(mutant))
+            kind = [".cpp", ".h", ".java"].index(pathlib.Path(mutant.file).suffix)
+            before = key(mutant) in self.results.rows
+            groups[before, emulated, kind, mutant.file].append(mutant)
+        for _, group in sorted(groups.items()):
+            for i in range(0, len(group), CHUNK):
+                yield group[i:i + CHUNK]
 
     def worker(self, number):
+        trials = {}
         try:
-            workshop = Workshop(self.work / f"worker-{number}")
-            workshop.prepare()
-            with self.lock:
-                self.started = time.monotonic()
-            while not self.errors:
+            while True:
                 for mutant in self.chunks.get_nowait():
-                    began = time.monotonic()
-                    fate = workshop.fate(mutant)
+                    if time.monotonic() > self.end or self.errors:
+                        return
+                    language = java if mutant.file.endswith(".java") else cpp
+                    if language not in trials:
+                        trials[language] = language.Trial(self.original(language),
+                                                          self.work / f"worker-{number}")
+                    fate = trials[language].fate(mutant)
                     with self.lock:
-                        self.fates[mutant] = fate
-                        self.results.write(f"{fate}\t{time.monotonic() - began:.1f}\t"
-                                           f"{title(mutant)}\t{mutant.line_text}\n")
-                        self.results.flush()
+                        self.rows[mutant] = self.results.add(mutant, fate)
+                        self.seconds += fate.seconds
         except queue.Empty:
             pass
         except Exception as error:  # shown by the main thread
             self.errors.append(error)
+        finally:
+            for trial in trials.values():
+                trial.end()
+
+    def original(self, language):
+        """What the workers share of a language, made when it is needed."""
+        with self.making:
+            if language not in self.originals:
+                original = language.Original(self.work)
+                original.prepare()
+                self.originals[language] = original
+            return self.originals[language]
 
     def go(self):
-        """Runs everything and returns the fate of each mutant."""
+        """Runs everything and returns the row of each mutant."""
+        self.results.open({m.file for m in self.mutants})
+        say("building what the mutants need, and running the tests without a mutant")
+        self.originals = {}
+        self.making = threading.Lock()
         self.started = time.monotonic()
         threads = [threading.Thread(target=self.worker, args=[n], daemon=True)
                    for n in range(self.workers)]
-        with open(self.work / "results.tsv", "w") as self.results:
-            for thread in threads:
-                thread.start()
-            while any(thread.is_alive() for thread in threads):
-                self.wait_and_say(threads)
+        for thread in threads:
+            thread.start()
+        while any(thread.is_alive() for thread in threads):
+            self.wait_and_say(threads)
         if self.errors:
             raise self.errors[0]
-        return self.fates
+        return self.rows
 
     def wait_and_say(self, threads):
-        until = time.monotonic() + 20
+        until = time.monotonic() + 60
         while time.monotonic() < until and any(thread.is_alive() for thread in threads):
             time.sleep(0.2)
-        done = len(self.fates)
+        done = len(self.rows)
         if not done:
-            return say("building the library and its tests for each worker")
+            return
         left = (time.monotonic() - self.started) / done * (len(self.mutants) - done)
-        alive = sum(fate == "survived" for fate in self.fates.values())
-        say(f"{done} of {len(self.mutants)} mutants, {alive} survived, "
-            f"about {left / 60:.0f} minutes left")
+        alive = sum(row.fate in ALIVE for row in self.rows.values())
+        say(f"{done} of {len(self.mutants)} mutants, {alive} alive, {self.seconds / done:.2f} "
+            f"processor seconds each, about {left / 60:.0f} minutes left")
 
 
 def say(text):
@@ -375,32 +218,33 @@ def show(heading, mutants):
             f"{mutant.file}{again}: {mutant.line_text}\n  {description(mutant)}")
 
 
-def report(fates, explained, everything, seconds):
+def print_outcome(rows, explained, everything):
     """Prints what became of the mutants. Returns figures and whether all is in order."""
-    count = collections.Counter(fates.values())
-    survivors = [m for m, fate in fates.items() if fate == "survived"]
-    unexplained = [m for m in survivors if key(m) not in explained]
-    killed_yet_explained = [m for m, fate in fates.items() if key(m) in explained
-                            and fate not in ("survived", "same code")]
+    count = collections.Counter(row.fate for row in rows.values())
+    alive = [m for m, row in rows.items() if row.fate in ALIVE]
+    unexplained = [m for m in alive if not explains(explained, m)]
+    wrongly_explained = [m for m, row in rows.items() if key(m) in explained
+                         and row.fate not in ALIVE + ["same code"]]
     known = {key(m) for m in everything}
     stale = [entry for entry in explained if entry not in known]
 
-    counted = sum(n for fate, n in count.items() if fate not in ("does not compile", "same code"))
-    killed = counted - count["survived"]
-    say(f"\n{counted + count['same code']} mutants that compile, in {seconds / 60:.1f} minutes")
-    for fate in ("unit tests", "hung", "differential", "sanitized", "same code"):
-        say(f"  {count[fate]:5}  {fate}")
-    say(f"  {len(survivors) - len(unexplained):5}  survived, explained")
-    say(f"  {len(unexplained):5}  survived")
-    say(f"and {count['does not compile']} that do not compile")
+    killed = sum(count[fate] for fate in KILLED)
+    say(f"\n{killed + len(alive)} mutants that compile, and not to the same code")
+    for fate in KILLED:
+        say(f"  {count[fate]:5}  killed: {fate}")
+    say(f"  {len(alive) - len(unexplained):5}  not killed, explained")
+    for fate in ALIVE:
+        say(f"  {sum(rows[m].fate == fate for m in unexplained):5}  {fate}, not explained")
+    say(f"and {count['same code']} of the same code, {count['does not compile']} that do not compile")
 
     show("\nNo test notices these mutants, and survivors.txt does not explain why:", unexplained)
-    show("\nExplained in survivors.txt, yet a test notices them:", killed_yet_explained)
+    show("\nExplained in survivors.txt, yet a test notices them:", wrongly_explained)
     if stale:
         say("\nNo longer in the sources, but in survivors.txt:")
     for file, number, line, change in stale:
         say(f"  {file}{'@' + str(number) if number > 1 else ''}: {line}\n    {change}")
-    return killed, counted, not (unexplained or killed_yet_explained or stale), unexplained
+    in_order = not (unexplained or wrongly_explained or stale)
+    return killed, killed + len(alive), in_order, unexplained
 
 
 def write_summary(path, killed, counted, in_order, unexplained):
@@ -413,6 +257,13 @@ def write_summary(path, killed, counted, in_order, unexplained):
         file.write(f"mutation\t{killed} of {counted} mutants killed\t{limit}\n")
 
 
+def positive(text):
+    number = int(text)
+    if number < 1:
+        raise argparse.ArgumentTypeError(f"{number} is below 1")
+    return number
+
+
 def read_arguments():
     parser = argparse.ArgumentParser(description="Mutation testing of the library.")
     parser.add_argument("--all", action="store_true", help="all mutants, not the standard set")
@@ -420,33 +271,81 @@ def read_arguments():
     parser.add_argument("--files", metavar="GLOB", help="only sources that match, e.g. 'render/*'")
     parser.add_argument("--only", metavar="TEXT", action="append",
                         help="only mutants with TEXT in their name; may be given again")
-    parser.add_argument("--sample", type=int, metavar="N", help="N of these, drawn at random")
+    parser.add_argument("--sample", type=positive, metavar="N", help="N of these, drawn at random")
     parser.add_argument("--seed", type=int, default=1, metavar="S", help="draws the sample")
-    parser.add_argument("--workers", type=int, default=2, metavar="N", help="at a time (default 2)")
+    parser.add_argument("--resume", action="store_true",
+                        help="take from earlier runs what still holds")
+    parser.add_argument("--minutes", type=positive, default=1 << 30, metavar="N",
+                        help="stop after so many, keeping what is done")
+    parser.add_argument("--workers", type=positive, default=2, metavar="N",
+                        help="at a time (default 2)")
+    parser.add_argument("--report", action="store_true",
+                        help="write tables and page of the results that there are")
+    parser.add_argument("--check", action="store_true",
+                        help="with --report: write nothing, fail when the page does not fit")
     parser.add_argument("--list", action="store_true", help="list the mutants and stop")
     parser.add_argument("--work", default=ROOT / "build" / "mutation", type=pathlib.Path,
-                        metavar="DIR", help="copies and builds (default build/mutation)")
+                        metavar="DIR", help="copies, builds and results (default build/mutation)")
     parser.add_argument("--summary", type=pathlib.Path, metavar="FILE",
                         help="append 'mutation<TAB>figure<TAB>limit' to FILE")
-    return parser.parse_args()
+    arguments = parser.parse_args()
+    if arguments.check and not arguments.report:
+        parser.error("--check goes with --report")
+    return arguments
 
 
 def chosen(everything, arguments):
-    standard = standard_set(everything)
-    mutants = [m for m in everything
+    runnable = [m for m in everything if m.file not in NO_TEST and processor_of(m)]
+    standard = standard_set(runnable)
+    mutants = [m for m in runnable
                if arguments.all or (key(m) in standard) != arguments.rest]
     if arguments.files:
         mutants = [m for m in mutants if fnmatch.fnmatch(m.file, arguments.files)]
     if arguments.only:
         mutants = [m for m in mutants if any(text in title(m) for text in arguments.only)]
+    if not (arguments.files or arguments.only):
+        mutants = [m for m in mutants if m.file not in LEFT_FOR_LATER]
     if arguments.sample is not None and arguments.sample < len(mutants):
         mutants = random.Random(arguments.seed).sample(mutants, arguments.sample)
     return mutants
 
 
+def write_report(everything, explained, work):
+    path = work / "results.tsv"
+    if not path.exists():
+        sys.exit(f"there are no results in {work} to report")
+    new = report.table_of(everything, Results(path), lambda m: explains(explained, m))
+    table, alive = report.merged(*new, *report.read_tables(), explained)
+    report.write_tables(table, alive)
+    table, alive = report.read_tables()
+    report.PAGE.write_text(report.page_of(table, alive, narrow(explained)))
+    say(f"written: {report.TABLE}, {report.UNEXPLAINED}, {report.PAGE}")
+    return 0
+
+
+def check_report(explained):
+    table, alive = report.read_tables()
+    faults = report.faults(table, alive, explained, report.page_of(table, alive, narrow(explained)))
+    for fault in faults:
+        say(fault)
+    older = [line["file"] for line in table.values()
+             if (ROOT / line["file"]).exists() and line["state"] != state(line["file"])]
+    if older:
+        say(f"changed since they were run: {', '.join(older)}")
+    return 1 if faults else 0
+
+
+def narrow(explained):
+    return [(entry, e.holds) for entry, e in explained.items() if e.holds]
+
+
 def main():
     arguments = read_arguments()
+    if arguments.report and arguments.check:
+        return check_report(read_survivors(SURVIVORS))
     everything = all_mutants()
+    if arguments.report:
+        return write_report(everything, read_survivors(SURVIVORS), arguments.work.resolve())
     mutants = chosen(everything, arguments)
     if arguments.list:
         for mutant in mutants:
@@ -457,14 +356,28 @@ def main():
     explained = read_survivors(SURVIVORS)
     work = arguments.work.resolve()
     work.mkdir(parents=True, exist_ok=True)
-    say(f"{len(mutants)} of {len(everything)} mutants, {arguments.workers} at a time, in {work}")
-    began = time.monotonic()
+    lock = open(work / "lock", "w")
     try:
-        fates = Run(mutants, work, arguments.workers).go()
-    except StepFailed as error:
-        sys.exit(str(error))
-    killed, counted, in_order, unexplained = report(fates, explained, everything,
-                                                    time.monotonic() - began)
+        fcntl.flock(lock, fcntl.LOCK_EX | fcntl.LOCK_NB)
+    except OSError:
+        sys.exit(f"another run is at work in {work}")
+
+    results = Results(work / "results.tsv")
+    rows = {}
+    if arguments.resume:
+        known = {m: results.known(m) for m in mutants}
+        rows = {m: row for m, row in known.items() if row}
+        say(f"{len(rows)} of {len(mutants)} mutants are known from earlier runs")
+    left = [m for m in mutants if m not in rows]
+    say(f"{len(left)} of {len(everything)} mutants to run, {arguments.workers} at a time, in {work}")
+    if left:
+        try:
+            rows |= Run(left, results, work, arguments.workers, arguments.minutes).go()
+        except StepFailed as error:
+            sys.exit(str(error))
+    killed, counted, in_order, unexplained = print_outcome(rows, explained, everything)
+    if len(rows) < len(mutants):
+        say(f"\n{len(mutants) - len(rows)} mutants are left for a run with --resume")
     if arguments.summary:
         write_summary(arguments.summary, killed, counted, in_order, unexplained)
     return 0 if in_order else 1

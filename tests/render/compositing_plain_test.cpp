@@ -11,6 +11,7 @@
 
 #include "render/compositing.h"
 #include "tests/differential/random_source.h"
+#include "tests/helpers/block_edges.h"
 #include "tests/helpers/guarded_buffer.h"
 
 namespace {
@@ -131,5 +132,43 @@ TEST(compositing_plain, EqualsTheFastLookupInAScaledMask) {
                 plain::ze_draw_reverse_mask_v2(src, dst, mask, 0, width, height, mask_width,
                                                mask_height, ratio);
             });
+    }
+}
+
+TEST(compositing_plain, EqualsTheFastDrawingOfASinglePixelInEveryColumn) {
+    constexpr int HEIGHT = 2;
+    random_source random(5);
+    for (const int width : LENGTHS_AROUND_BLOCKS) {
+        picture p(random, width, HEIGHT, width, HEIGHT);
+        for (const int x : places_in(width)) {
+            SCOPED_TRACE("column " + std::to_string(x) + " of " + std::to_string(width));
+            for (const unsigned char value : {0, 1}) {
+                p.mask.assign(p.mask.size(), static_cast<unsigned char>(1 - value));
+                p.mask[static_cast<size_t>(x + width)] = value;
+                p.compare([&](auto src, auto dst,
+                              auto mask) { ze_draw_reverse_mask(src, dst, mask, width, HEIGHT); },
+                          [&](auto src, auto dst, auto mask) {
+                              plain::ze_draw_reverse_mask(src, dst, mask, width, HEIGHT);
+                          });
+                for (const int left : {0, x / 2}) {
+                    p.compare(
+                        [&](auto src, auto dst, auto mask) {
+                            ze_draw_withmask(src, dst, mask, width, left, width - 1, 0, 1);
+                        },
+                        [&](auto src, auto dst, auto mask) {
+                            plain::ze_draw_withmask(src, dst, mask, width, left, width - 1, 0, 1);
+                        });
+                }
+                p.compare(
+                    [&](auto src, auto dst, auto mask) {
+                        ze_draw_reverse_mask_v2(src, dst, mask, 0, width, HEIGHT, width, HEIGHT, 1);
+                    },
+                    [&](auto src, auto dst, auto mask) {
+                        plain::ze_draw_reverse_mask_v2(src, dst, mask, 0, width, HEIGHT, width,
+                                                       HEIGHT, 1);
+                    });
+                if (HasFatalFailure()) return;
+            }
+        }
     }
 }

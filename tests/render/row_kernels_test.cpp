@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cstring>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "tests/differential/random_source.h"
@@ -385,16 +386,34 @@ TEST_P(row_kernel, PacksZeroesAndOnesIntoWords) {
     }
 }
 
+TEST_P(row_kernel, PacksASingleOneAndASingleZeroAtEveryPlace) {
+    for (size_t count = 1; count <= 6; ++count) {
+        for (size_t place = 0; place < 64 * count; ++place) {
+            for (const uint8_t lone : {0, 1}) {
+                bytes row(64 * count, 1 - lone);
+                row[place] = lone;
+                std::vector<uint64_t> words(count, 7);
+                std::vector<uint64_t> expected(count, lone == 1 ? 0 : ~uint64_t{0});
+                expected[place / 64] ^= uint64_t{1} << place % 64;
+                ASSERT_EQ(kernels.pack_bits(row.data(), words.data(), count), count);
+                ASSERT_EQ(words, expected) << int{lone} << " at " << place << " of " << row.size();
+            }
+        }
+    }
+}
+
 TEST_P(row_kernel, PacksNoWordWithAnotherValue) {
-    for (const uint8_t value : {2, 3, 5, 128, 254, 255}) {
-        for (size_t place = 0; place < 192; ++place) {
-            bytes row(192, 1);
-            row[place] = value;
-            std::vector<uint64_t> words(3, 7), expected(3, 7);
-            const size_t whole = place / 64;
-            std::fill_n(expected.begin(), whole, ~uint64_t{0});
-            EXPECT_EQ(kernels.pack_bits(row.data(), words.data(), 3), whole);
-            EXPECT_EQ(words, expected);
+    for (const uint8_t value : {2, 3, 4, 5, 128, 254, 255}) {
+        for (const uint8_t others : {0, 1}) {
+            for (size_t place = 0; place < 192; ++place) {
+                bytes row(192, others);
+                row[place] = value;
+                std::vector<uint64_t> words(3, 7), expected(3, 7);
+                const size_t whole = place / 64;
+                std::fill_n(expected.begin(), whole, others == 1 ? ~uint64_t{0} : 0);
+                ASSERT_EQ(kernels.pack_bits(row.data(), words.data(), 3), whole);
+                ASSERT_EQ(words, expected) << int{value} << " at " << place;
+            }
         }
     }
 }
@@ -411,4 +430,185 @@ TEST_P(row_kernel, FindsTheLastSelectedPixel) {
             EXPECT_EQ(kernels.last_selected(selected.data(), n), k);
         }
     });
+}
+
+TEST_P(row_kernel, FindsTheOnlySelectedPixelAtEveryPlaceOfEveryLength) {
+    constexpr size_t LONGEST = 3 * 128 + 1;  // blocks of 128 bytes, and a byte more
+    for (const uint8_t others : {0, 2, 3, 5, 255}) {
+        bytes row(LONGEST, others);
+        for (size_t n = 0; n <= LONGEST; ++n) {
+            ASSERT_EQ(kernels.last_selected(row.data(), n), -1) << n << " times " << int{others};
+            for (size_t place = 0; place < n; ++place) {
+                row[place] = 1;
+                ASSERT_EQ(kernels.last_selected(row.data(), n), place)
+                    << "of " << n << ", among " << int{others};
+                row[place] = others;
+            }
+        }
+    }
+}
+
+namespace {
+
+// A row of n values that are alike but for one.
+struct lone_value {
+    size_t n, place;
+    uint8_t lone, others;
+
+    // The row with each value replaced by what it stands for.
+    template <class ValueOf>
+    auto row(ValueOf value_of) const {
+        std::vector<decltype(value_of(lone))> values(n, value_of(others));
+        values[place] = value_of(lone);
+        return values;
+    }
+};
+
+uint8_t same(uint8_t value) { return value; }
+
+// Runs a test for every place in every length up to three times the bytes that any variant handles
+// in a step, and one more.
+template <class Test>
+void at_every_place(Test test) {
+    using values = std::pair<uint8_t, uint8_t>;  // one, the others
+    const std::vector<values> zero_and_one = {{1, 0}, {0, 1}};
+    const std::vector<values> all = {{2, 0}, {3, 0}, {4, 0}, {5, 0}, {255, 0}, {2, 1},
+                                     {3, 1}, {5, 1}, {1, 2}, {1, 3}, {1, 5},   {1, 255}};
+    for (size_t n = 1; n <= 3 * 64 + 1; ++n) {
+        const bool all_values = n == 7 || n == 33 || n == 65;
+        for (const auto& [lone, others] : all_values ? all : zero_and_one) {
+            for (size_t place = 0; place < n; ++place) {
+                test(lone_value{n, place, lone, others});
+                ASSERT_FALSE(testing::Test::HasFailure())
+                    << int{lone} << " at " << place << " of " << n << " times " << int{others};
+            }
+        }
+    }
+}
+
+constexpr uint32_t COLOUR = 0x87A04521, ITS_GREY = 0x87575757;
+
+}  // namespace
+
+TEST_P(row_kernel, GreysASingleColourAtEveryPlace) {
+    at_every_place([&](const lone_value& values) {
+        const pixels src = values.row([](uint8_t v) { return v == 1 ? COLOUR : 0x12000000; });
+        const pixels grey = values.row([](uint8_t v) { return v == 1 ? ITS_GREY : 0x12000000; });
+        pixels to(values.n, 7);
+        kernels.grey(src.data(), to.data(), values.n);
+        EXPECT_EQ(to, grey);
+    });
+}
+
+TEST_P(row_kernel, ColoursAndInvertsASinglePixelAtEveryPlace) {
+    at_every_place([&](const lone_value& values) {
+        const size_t n = values.n;
+        const bytes mask = values.row(same);
+        const bytes inverse = values.row([](uint8_t v) { return uint8_t{v != 1}; });
+        const pixels src(n, COLOUR);
+        pixels to(n, 7);
+        kernels.colour_selection(src.data(), mask.data(), to.data(), n);
+        EXPECT_EQ(to, values.row([](uint8_t v) { return v == 1 ? COLOUR : ITS_GREY; }));
+
+        bytes inverted = mask;
+        kernels.invert_and_colour(src.data(), inverted.data(), to.data(), n);
+        EXPECT_EQ(to, values.row([](uint8_t v) { return v == 1 ? ITS_GREY : COLOUR; }));
+        EXPECT_EQ(inverted, inverse);
+
+        inverted = mask;
+        kernels.invert(inverted.data(), n);
+        EXPECT_EQ(inverted, inverse);
+    });
+}
+
+TEST_P(row_kernel, ClassifiesASingleValueAtEveryPlace) {
+    const auto class_of = [](uint8_t v) {
+        if (v == 1 || v == 3) return OUTLINE_SELECTED;
+        return v == 0 || v == 4 || v == 5 ? OUTLINE_OUTSIDE : uint8_t{0};
+    };
+    at_every_place([&](const lone_value& values) {
+        const bytes mask = values.row(same);
+        bytes classes(values.n, 77);
+        kernels.classify(mask.data(), classes.data(), values.n);
+        EXPECT_EQ(classes, values.row(class_of));
+    });
+}
+
+TEST_P(row_kernel, GathersASinglePixelAtEveryPlace) {
+    bytes byte_row(256);
+    for (size_t i = 0; i < 256; ++i) byte_row[i] = static_cast<uint8_t>(255 - i);
+    const ints pixel_row(byte_row.begin(), byte_row.end());
+    at_every_place([&](const lone_value& values) {
+        const ints columns = values.row([](uint8_t v) { return int32_t{v}; });
+        bytes gathered_bytes(values.n, 77);
+        kernels.gather_bytes(byte_row.data(), columns.data(), gathered_bytes.data(), values.n);
+        EXPECT_EQ(gathered_bytes, values.row([&](uint8_t v) { return byte_row[v]; }));
+
+        ints gathered_pixels(values.n, 77);
+        kernels.gather_pixels(pixel_row.data(), columns.data(), gathered_pixels.data(), values.n);
+        EXPECT_EQ(gathered_pixels, values.row([&](uint8_t v) { return pixel_row[v]; }));
+    });
+}
+
+TEST_P(row_kernel, DoublesASinglePixelAtEveryPlace) {
+    at_every_place([&](const lone_value& values) {
+        const ints row = values.row([](uint8_t v) { return int32_t{v}; });
+        const size_t i = 2 * values.place;
+        for (const size_t n : {2 * values.n - 1, 2 * values.n}) {
+            ints expected(n, values.others), doubled(n, 77);
+            expected[i] = values.lone;
+            if (i + 1 < n) expected[i + 1] = values.lone;
+            kernels.double_pixels(row.data(), doubled.data(), n);
+            EXPECT_EQ(doubled, expected);
+        }
+    });
+}
+
+namespace {
+
+// One value that differs from the others of its row, or of one of the rows around it, is all that
+// makes a flag, or all that prevents one.
+template <class ValueOf, class Selected, class Outside>
+void expect_single_flags(outline_kernel outline, ValueOf value_of, Selected selected,
+                         Outside outside) {
+    at_every_place([&](const lone_value& values) {
+        const size_t n = values.n;
+        const bytes row = values.row(value_of);
+        const bytes all_selected(n, value_of(1)), all_outside(n, value_of(0));
+        bytes flags(n, 77);
+        const uint8_t* const surroundings = all_outside.data();
+        const bool any = outline(
+            row.data(), {surroundings, surroundings, surroundings, surroundings}, flags.data(), n);
+        EXPECT_EQ(flags, values.row([&](uint8_t v) { return uint8_t{selected(value_of(v))}; }));
+        EXPECT_EQ(any, std::memchr(flags.data(), 1, n) != nullptr);
+
+        for (int neighbour = 0; neighbour < 4; ++neighbour) {
+            const uint8_t* rows[4];
+            std::fill_n(rows, 4, all_selected.data());
+            rows[neighbour] = row.data();
+            const bool any_beside =
+                outline(all_selected.data(), {rows[0], rows[1], rows[2], rows[3]}, flags.data(), n);
+            EXPECT_EQ(flags, values.row([&](uint8_t v) { return uint8_t{outside(value_of(v))}; }))
+                << "neighbour " << neighbour;
+            EXPECT_EQ(any_beside, std::memchr(flags.data(), 1, n) != nullptr);
+        }
+    });
+}
+
+}  // namespace
+
+TEST_P(row_kernel, FlagsASingleClassAtEveryPlace) {
+    const auto class_of = [](uint8_t v) {
+        if (v == 0) return OUTLINE_OUTSIDE;
+        return v == 1 ? OUTLINE_SELECTED : uint8_t{0};
+    };
+    expect_single_flags(
+        kernels.outline, class_of, [](uint8_t c) { return c == OUTLINE_SELECTED; },
+        [](uint8_t c) { return c == OUTLINE_OUTSIDE; });
+}
+
+TEST_P(row_kernel, FlagsASinglePixelAtEveryPlace) {
+    expect_single_flags(
+        kernels.small_outline, same, [](uint8_t v) { return v == 1; },
+        [](uint8_t v) { return v == 0; });
 }

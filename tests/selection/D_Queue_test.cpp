@@ -484,6 +484,89 @@ TEST(D_Queue_pop, NeverCountsBelowZero) {
     }
 }
 
+// Whoever writes the count may write any number.
+TEST(D_Queue_pop, CountsTheLowestNumberAsNone) {
+    linked_queue f(100, {1, 2});
+    f.q.count = INT_MIN;
+    f.q.pop();
+    EXPECT_EQ(f.q.count, 0);
+}
+
+TEST(D_Queue_push, CountsOnFromTheHighestNumberToTheLowest) {
+    linked_queue f(100, {1, 2});
+    f.q.count = INT_MAX;
+    node n = with_cost(3);
+    EXPECT_EQ(f.q.push(&n), 1);
+    EXPECT_EQ(f.q.count, INT_MIN);
+}
+
+// ---- a null entry comes back, and what it hid has been popped
+
+namespace {
+
+// Four nodes make four entries. Then a new head makes the first entry null: its node is the head no
+// longer and has no `prev`. The entries behind it are no longer moved, and all nodes are popped.
+struct hidden_entries : filled_queue {
+    hidden_entries() : filled_queue(1, {1, 2, 3, 4}) {
+        q.pop();
+        push(0);
+        while (!q.empty()) q.pop();
+    }
+};
+
+}  // namespace
+
+TEST(D_Queue_push, FindsPoppedNodesBehindANullThatIsSetAgain) {
+    hidden_entries f;
+    EXPECT_EQ(f.q.index[0], nullptr);
+    EXPECT_EQ(f.q.index[1], f[1]);
+
+    node* const first = f.push(10);
+
+    EXPECT_EQ(f.q.index[0], first);
+    EXPECT_EQ(f.q.index[1], f[1]) << "popped";
+}
+
+TEST(D_Queue_push, LosesANodeDearerThanThePoppedOnesItWalksFrom) {
+    hidden_entries f;
+    node* const first = f.push(10);
+    node* const second = f.push(20);
+    ASSERT_EQ(f.q.index[2], f[2]) << "popped";
+
+    node* const third = f.push(30);
+
+    EXPECT_EQ(third->prev, f[3]);
+    EXPECT_EQ(f.q.tail, third);
+    EXPECT_THAT(listed(f.q), ElementsAre(first, second));
+    EXPECT_EQ(f.q.count, 3);
+}
+
+TEST(D_Queue_push, SeesNoPoppedNodeWhereAQueuedOneIsNotCheaper) {
+    hidden_entries f;
+    node* const first = f.push(10);
+    node* const second = f.push(20);
+
+    node* const third = f.push(15);
+
+    EXPECT_THAT(listed(f.q), ElementsAre(first, third, second));
+}
+
+// ---- the engine lowers the cost of a node: it unlinks the node and pushes it again
+
+TEST(D_Queue_push, LeavesAnEntryOneNodeNearerTheHeadForEachNodeLoweredBeforeIt) {
+    filled_queue f(2, {1, 5, 6, 7});
+    ASSERT_EQ(f.q.index[1], f[3]);
+    f[2]->prev->next = f[2]->next;  // the 6
+    f[2]->next->prev = f[2]->prev;
+    --f.q.count;
+    f[2]->cost = 3;
+
+    EXPECT_EQ(f.q.push(f[2]), 1);
+
+    EXPECT_THAT(listed(f.q), ElementsAre(f[0], f[2], f[1], f[3]));
+    EXPECT_EQ(f.q.index[0], f[0]);  // was f[1], which is third now
+}
+
 // ---- rings
 
 // An entry whose `prev` leads forward lets a push close the list behind itself.

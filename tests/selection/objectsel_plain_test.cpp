@@ -3,12 +3,14 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <climits>
 #include <string>
 #include <vector>
 
 #include "selection/objectsel.h"
 #include "tests/differential/random_source.h"
+#include "tests/helpers/block_edges.h"
 #include "tests/helpers/guarded_buffer.h"
 #include "tests/helpers/rect_printing.h"
 
@@ -87,6 +89,51 @@ TEST(objectsel_plain, EqualsTheFastObjectBoxOfNothing) {
                     {INT_MIN, INT_MAX, INT_MIN, INT_MAX});
             compare(ze_update_objectROI, plain::ze_update_objectROI, {1}, width, height,
                     {INT_MAX, INT_MIN, INT_MAX, INT_MIN});
+        }
+    }
+}
+
+TEST(objectsel_plain, BoxesASinglePixelInEveryColumn) {
+    constexpr int HEIGHT = 3;
+    for (const int width : LENGTHS_AROUND_BLOCKS) {
+        for (const int x : places_in(width)) {
+            const int y = x % HEIGHT;
+            const size_t pixel = static_cast<size_t>(y * width + x);
+            for (const unsigned char others : {0, 2, 255}) {
+                guarded_buffer<unsigned char> mask(
+                    std::vector<unsigned char>(static_cast<size_t>(width * HEIGHT), others),
+                    guard::BEHIND);
+                mask.data()[pixel] = 1;
+                g_object_boundary = {0, width - 1, 0, HEIGHT - 1};
+                ze_update_objectROI(mask.data(), width, HEIGHT);
+                ASSERT_EQ(g_object_boundary, (ze_rect{x, x, y, y})) << "of " << width;
+            }
+            guarded_buffer<unsigned char> inverted(
+                std::vector<unsigned char>(static_cast<size_t>(width * HEIGHT), 1), guard::BEHIND);
+            inverted.data()[pixel] = 0;
+            ze_inverse_mask(inverted.data(), width, HEIGHT);
+            ASSERT_EQ(g_object_boundary, (ze_rect{x, x, y, y})) << "inverted, of " << width;
+        }
+    }
+}
+
+// Of rows between, only what lies left and right of all that has been found is read.
+TEST(objectsel_plain, BoxesOnePixelInEachOfThreeRows) {
+    constexpr int WIDTH = 193;
+    const std::vector<int> columns = {0, 1, 62, 63, 64, 65, 126, 127, 128, 129, 190, 191, 192};
+    for (const int first : columns) {
+        for (const int second : columns) {
+            for (const int third : columns) {
+                std::vector<unsigned char> mask(3 * WIDTH, 0);
+                for (const int i : {first, WIDTH + second, 2 * WIDTH + third}) {
+                    mask[static_cast<size_t>(i)] = 1;
+                }
+                const auto [left, right] = std::minmax({first, second, third});
+                g_object_boundary = {0, WIDTH - 1, 0, 2};
+                ze_update_objectROI(mask.data(), WIDTH, 3);
+                ASSERT_EQ(g_object_boundary, (ze_rect{left, right, 0, 2}))
+                    << first << ", " << second << ", " << third;
+            }
         }
     }
 }

@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -74,6 +75,155 @@ TEST(bits, ThePreviousOneIsLookedForDownToTheStart) {
     EXPECT_EQ(previous_bit(row, 128), 4);
     EXPECT_EQ(previous_bit(row, 4), 4);
     EXPECT_EQ(previous_bit(row, 3), -1);
+}
+
+namespace {
+
+constexpr int ROW_WORDS = 3;
+constexpr int ROW_BITS = ROW_WORDS * WORD_BITS;
+constexpr int EDGES[] = {0, 1, 62, 63, 64, 65, 126, 127, 128, 129, 190, 191};
+
+bool has_bit(const bit_word* words, int bit) { return (words[bit / 64] >> bit % 64 & 1) != 0; }
+
+}  // namespace
+
+TEST(bits, CellsBetweenAnyTwoColumnsAreCutAtTheirWords) {
+    for (const int first : EDGES) {
+        for (const int last : EDGES) {
+            if (first > last) continue;
+            for (int word = first / 64; word <= last / 64; ++word) {
+                bit_word expected = 0;
+                for (int bit = 0; bit < 64; ++bit) {
+                    const int column = 64 * word + bit;
+                    if (column >= first && column <= last) expected |= bit_word{1} << bit;
+                }
+                EXPECT_EQ(bits_between(first, last, word), expected) << first << " .. " << last;
+            }
+        }
+    }
+}
+
+TEST(bits, AnyOnlyRunOfAWordIsFound) {
+    for (int first = 0; first < 64; ++first) {
+        for (int end = first + 1; end <= 64; ++end) {
+            bit_word run = 0;
+            for (int bit = first; bit < end; ++bit) run |= bit_word{1} << bit;
+            ASSERT_THAT(runs_of(run), ElementsAre(Pair(first, end - first)));
+            ASSERT_EQ(lowest_bit(run), first);
+            ASSERT_EQ(highest_bit(run), end - 1);
+            ASSERT_EQ(count_bits(run), end - first);
+            ASSERT_EQ(count_bits(~run), 64 - (end - first));
+            ASSERT_EQ(bits_from(first) & bits_up_to(end - 1), run);
+        }
+    }
+}
+
+TEST(bits, TheOnlyOneOfARowIsFoundFromEitherSide) {
+    for (int bit = 0; bit < ROW_BITS; ++bit) {
+        bit_word row[ROW_WORDS] = {};
+        row[bit / 64] = bit_word{1} << bit % 64;
+        for (const int from : EDGES) {
+            ASSERT_EQ(previous_bit(row, from), bit <= from ? bit : -1) << bit << " from " << from;
+            for (const int end : EDGES) {
+                ASSERT_EQ(next_bit(row, from, end), bit >= from && bit < end ? bit : end)
+                    << bit << " from " << from << " to " << end;
+            }
+        }
+    }
+}
+
+// ---- sets of words
+
+TEST(word_set, HoldsTheWordsPutInAndNoOthers) {
+    bit_word memory[3 * ROW_WORDS] = {};
+    word_set set(memory, ROW_WORDS);
+    for (const int word : EDGES) {
+        set.insert({1, word});
+        for (int row = 0; row < 3; ++row) {
+            for (int other = 0; other < ROW_BITS; ++other) {
+                ASSERT_EQ(set.has({row, other}), row == 1 && other == word) << word;
+            }
+        }
+        set.set({1, word}, true);
+        EXPECT_TRUE(set.has({1, word}));
+        set.erase({1, word});
+        EXPECT_FALSE(set.has({1, word}));
+        set.set({1, word}, false);
+        EXPECT_FALSE(set.has({1, word}));
+        set.set({1, word}, true);
+        EXPECT_TRUE(set.has({1, word}));
+        set.set({1, word}, false);
+        EXPECT_FALSE(set.has({1, word}));
+    }
+}
+
+TEST(word_set, TakesAndLosesWordsFromOnePlaceToBeforeAnother) {
+    for (const int from : EDGES) {
+        for (const int end : EDGES) {
+            bit_word memory[3 * ROW_WORDS] = {};
+            word_set set(memory, ROW_WORDS);
+            bit_word full_memory[3 * ROW_WORDS];
+            std::fill_n(full_memory, 3 * ROW_WORDS, ~bit_word{0});
+            word_set full(full_memory, ROW_WORDS);
+            set.insert({1, from}, end);
+            full.erase({1, from}, end);
+            for (int i = 0; i < 3 * ROW_BITS; ++i) {
+                const bool changed = i >= ROW_BITS + from && i < ROW_BITS + end;
+                ASSERT_EQ(has_bit(memory, i), changed) << from << " to " << end << ": " << i;
+                ASSERT_EQ(has_bit(full_memory, i), !changed) << from << " to " << end << ": " << i;
+            }
+        }
+    }
+}
+
+TEST(word_set, VisitsItsWordsFromOnePlaceToBeforeAnother) {
+    bit_word memory[3 * ROW_WORDS] = {};
+    word_set set(memory, ROW_WORDS);
+    for (const int word : EDGES) set.insert({1, word});
+    for (const int from : EDGES) {
+        for (const int end : EDGES) {
+            if (from >= end) continue;
+            std::vector<int> visited, expected;
+            for (const int word : EDGES) {
+                if (word >= from && word < end) expected.push_back(word);
+            }
+            set.for_each({1, from}, end, [&](word_place at) {
+                EXPECT_EQ(at.row, 1);
+                visited.push_back(at.word);
+            });
+            EXPECT_EQ(visited, expected) << from << " to " << end;
+        }
+    }
+}
+
+TEST(word_set, AVisitMayChangeTheSetAhead) {
+    bit_word memory[ROW_WORDS] = {};
+    word_set set(memory, ROW_WORDS);
+    for (const int word : {3, 63, 64, 70}) set.insert({0, word});
+    std::vector<int> visited;
+    set.for_each({0, 0}, ROW_BITS, [&](word_place at) {
+        visited.push_back(at.word);
+        set.insert({0, 2});   // behind
+        set.insert({0, 65});  // ahead
+        set.erase({0, 63});
+        set.erase({0, 70});
+    });
+    EXPECT_THAT(visited, ElementsAre(3, 64, 65));
+}
+
+TEST(word_set, FindsTheNextAndThePreviousWordOfARow) {
+    bit_word memory[3 * ROW_WORDS];
+    std::fill_n(memory, 3 * ROW_WORDS, ~bit_word{0});
+    word_set set(memory, ROW_WORDS);
+    set.erase({1, 0}, ROW_BITS);
+    EXPECT_EQ(set.next({1, 0}, ROW_BITS), ROW_BITS);
+    EXPECT_EQ(set.previous({1, ROW_BITS - 1}), -1);
+    for (const int word : EDGES) {
+        set.insert({1, word});
+        EXPECT_EQ(set.next({1, 0}, ROW_BITS), word);
+        EXPECT_EQ(set.previous({1, ROW_BITS - 1}), word);
+        set.erase({1, word});
+    }
 }
 
 // ---- reading the mask
@@ -272,4 +422,25 @@ TEST(flag_events, ReachFromOneEndOfTheWordToTheOther) {
     EXPECT_EQ((flag_events{0, 1}.inside(true)), 0u);
     EXPECT_EQ((flag_events{0, bit_word{1} << 63}.inside(true)), bits_up_to(62));
     EXPECT_TRUE((flag_events{1, 0}.last()));
+}
+
+TEST(flag_events, HoldFromAnySetToAnyClearOne) {
+    for (int set = 0; set < 64; ++set) {
+        for (int cleared = 0; cleared < 64; ++cleared) {
+            if (set == cleared) continue;
+            const flag_events events = {bit_word{1} << set, bit_word{1} << cleared};
+            for (const bool before : {false, true}) {
+                bit_word expected = 0;
+                bool inside = before;
+                for (int bit = 0; bit < 64; ++bit) {
+                    if (bit == set) inside = true;
+                    if (bit == cleared) inside = false;
+                    if (inside) expected |= bit_word{1} << bit;
+                }
+                ASSERT_EQ(events.inside(before), expected) << set << ", " << cleared;
+                ASSERT_EQ(events.last(), inside);
+                ASSERT_FALSE(events.none());
+            }
+        }
+    }
 }

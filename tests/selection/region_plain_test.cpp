@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <vector>
 
 #include "selection/region_shaping.h"
 #include "tests/helpers/failing_allocations.h"
@@ -140,7 +141,6 @@ TEST(RegionPasses, FillARemovingLassoLikeThePlainPass) {
                  run_lasso);
 }
 
-// Rows of more than 64 words, for whose sets of words one word is not enough.
 // Contours on the last column are seen beside the first, so a pixel that an earlier row left on the
 // far side begins an inside once a later region widens the area to it.
 TEST(RegionPasses, GoBackToEarlierRowsWhenTheAreaGetsWider) {
@@ -159,6 +159,79 @@ TEST(RegionPasses, GoBackToEarlierRowsWhenTheAreaGetsWider) {
     EXPECT_FALSE(mask == drawn);
 }
 
+// A cell that a pass fills beside a marker ends or begins an inside in the next pass.
+TEST(RegionPasses, LookAgainAtWordsWithACellFilledBesideAMarker) {
+    const Picture drawn(R"(
+        .....................................................2#.................
+        ...............................................................#........
+        ...............................................................#.....##.)");
+    outcome filled = {drawn, {72, 0, 3, 0}, {0, 71, 0, 2}, 0}, plainly_filled = filled;
+    run_fill(&Fill_Region, &filled);
+    run_fill(&plain::Fill_Region, &plainly_filled);
+    EXPECT_EQ(filled, plainly_filled);
+    EXPECT_FALSE(filled.mask == drawn);
+}
+
+// Rows are a set of words too, of which the first holds rows 0 to 63: a later region widens the
+// area from row 66 on, and row 16 has to be looked at again.
+TEST(RegionPasses, LookAgainAtRowsInAnEarlierWordOfRows) {
+    Picture drawn(65, 68, 0);
+    struct pixel {
+        int x, y;
+    };
+    for (const auto& [x, y] : {pixel{1, 15},
+                               {1, 16},
+                               {61, 16},
+                               {62, 59},
+                               {61, 60},
+                               {2, 66},
+                               {64, 66},
+                               {2, 67},
+                               {64, 67}}) {
+        drawn.at(x, y) = 1;
+    }
+    drawn.at(63, 16) = 2;
+    outcome filled = {drawn, {65, 0, 68, 0}, {0, 64, 0, 67}, 0}, plainly_filled = filled;
+    run_fill(&Fill_Region, &filled);
+    run_fill(&plain::Fill_Region, &plainly_filled);
+    EXPECT_EQ(filled, plainly_filled);
+}
+
+// A pass that begins in the first word of a row takes the flag that an earlier pass has left at the
+// end of the row above.
+TEST(RegionPasses, GoOnFromTheRowAboveThatAnEarlierPassHasSeen) {
+    const Picture masks[] = {Picture(R"(
+        2###..
+        ...##.
+        .###.#)"),
+                             Picture(R"(
+        ##.#.
+        ....#
+        2#...
+        .##..
+        .2##.
+        ..#.#)"),
+                             Picture(R"(
+        ..#.#.#
+        #...#..
+        ..#....
+        #.#.##.
+        .....##
+        #..#.#.
+        #......
+        .###...
+        #......)")};
+    for (const Picture& mask : masks) {
+        const outcome before = {
+            mask, {mask.width, 0, mask.height, 0}, {0, mask.width - 1, 0, mask.height - 1}, 0};
+        outcome erased = before, plainly_erased = before;
+        run_erase(&Erase_Region, &erased);
+        run_erase(&plain::Erase_Region, &plainly_erased);
+        EXPECT_EQ(erased, plainly_erased);
+    }
+}
+
+// Rows of more than 64 words, for whose sets of words one word is not enough.
 TEST(RegionPasses, WorkOnRowsOfThousandsOfPixels) {
     for (const int width : {4030, 4096, 9000}) {
         Picture mask(width, 7, 0);
@@ -172,6 +245,121 @@ TEST(RegionPasses, WorkOnRowsOfThousandsOfPixels) {
         run_erase(&Erase_Region, &erased);
         run_erase(&plain::Erase_Region, &plainly_erased);
         EXPECT_TRUE(erased == plainly_erased) << width;
+    }
+}
+
+namespace {
+
+Picture with_values(const Picture& mask, unsigned char selected) {
+    Picture other = mask;
+    for (unsigned char& pixel : other.cells) {
+        if (pixel == 1) pixel = selected;
+    }
+    return other;
+}
+
+template <class Pass, class Run>
+void expect_equal_on(const Picture& mask, const ze_rect& box, Pass pass, Pass plain_pass, Run run) {
+    outcome o = {mask, {mask.width, 0, mask.height, 0}, box, 0}, plain_outcome = o;
+    run(pass, &o);
+    run(plain_pass, &plain_outcome);
+    ASSERT_EQ(o, plain_outcome) << "box " << ::testing::PrintToString(box) << ", mask " << mask;
+}
+
+// All four passes, on the whole mask and on a box that begins and ends a column and a row further
+// inside.
+void expect_every_pass_equal(const Picture& mask) {
+    const ze_rect whole = {0, mask.width - 1, 0, mask.height - 1};
+    const ze_rect part = {1, mask.width - 2, 1, mask.height - 1};
+    for (const ze_rect& box : {whole, part}) {
+        expect_equal_on(mask, box, &Fill_Region, &plain::Fill_Region, run_fill);
+        expect_equal_on(mask, box, &Erase_Region, &plain::Erase_Region, run_erase);
+        expect_equal_on(with_values(mask, 5), box, &ze_lasso_add_fill_mask,
+                        &plain::ze_lasso_add_fill_mask, run_lasso);
+        expect_equal_on(with_values(mask, 3), box, &ze_lasso_del_fill_mask,
+                        &plain::ze_lasso_del_fill_mask, run_lasso);
+    }
+}
+
+Picture turned(const Picture& mask) {
+    Picture other(mask.height, mask.width, 0);
+    for (int y = 0; y < mask.height; ++y) {
+        for (int x = 0; x < mask.width; ++x) other.at(y, x) = mask.at(x, y);
+    }
+    return other;
+}
+
+constexpr int ROWS = 5;
+
+// What may go wrong at a column: a pixel alone there, a hole, an edge of a ring, a small ring
+// beside a larger block.
+std::vector<Picture> masks_for_column(int x, int width) {
+    Picture lone(width, ROWS, 0), hole(width, ROWS, 1), ring(width, ROWS, 0), rings(width, ROWS, 0);
+    lone.at(x, 2) = 1;
+    hole.at(x, 2) = 0;
+    draw_rectangle(&ring, 0, 0, x + 1, ROWS, true, 1);
+    draw_rectangle(&ring, x, 1, width - x, 3, true, 1);
+    draw_rectangle(&rings, std::max(x - 1, 0), 1, 3, 3, true, 1);
+    draw_rectangle(&rings, x < width / 2 ? width - 5 : 0, 0, 5, 4, false, 1);
+    return {lone, hole, ring, rings};
+}
+
+}  // namespace
+
+TEST(RegionPasses, WorkAtEveryColumn) {
+    for (int x = 0; x < 129; ++x) {
+        for (const Picture& mask : masks_for_column(x, 129)) {
+            expect_every_pass_equal(mask);
+            if (HasFatalFailure()) return;
+        }
+    }
+}
+
+TEST(RegionPasses, WorkAtTheEdgesOfWordsAndMasks) {
+    for (const int size : {63, 64, 65, 127, 128, 191, 192, 193}) {
+        for (int x = 0; x < size; ++x) {
+            const bool edge = (x + 3) % 64 < 6 || x >= size - 3;
+            if (!edge) continue;
+            for (const Picture& mask : masks_for_column(x, size)) {
+                expect_every_pass_equal(mask);
+                expect_every_pass_equal(turned(mask));
+                if (HasFatalFailure()) return;
+            }
+        }
+    }
+}
+
+// A row's sets of words begin a second word with column 4096.
+TEST(RegionPasses, WorkWhereSetsOfWordsBeginAnotherWord) {
+    for (const int width : {4097, 4161}) {
+        for (const int x : {3, 4031, 4094, 4095, 4096, 4159}) {
+            if (x >= width) continue;
+            for (const Picture& mask : masks_for_column(x, width)) {
+                expect_every_pass_equal(mask);
+                if (HasFatalFailure()) return;
+            }
+        }
+    }
+}
+
+// Noise around the end of a word and mostly on the left side too: with shared markers where the
+// mask ends there, and with 2s that count as visited from the start.
+TEST(RegionPasses, WorkOnNoiseAtTheEdgesOfWords) {
+    for (unsigned seed = 1; seed <= 4000; ++seed) {
+        random_numbers random(seed);
+        const int first = (random.one_in(4) ? 128 : 64) - random.between(0, 8);
+        const int last = first + random.between(1, 9), share = random.between(10, 80);
+        const int left_side = random.one_in(3) ? 0 : 3;
+        Picture mask(last + (random.one_in(3) ? 10 : 1), random.between(2, 9), 0);
+        for (int y = 0; y < mask.height; ++y) {
+            for (int x = 0; x < mask.width; ++x) {
+                const bool noisy = x < left_side || (x >= first && x <= last);
+                const bool drawn = noisy && random.between(0, 99) < share;
+                if (drawn) mask.at(x, y) = random.one_in(6) ? 2 : 1;
+            }
+        }
+        expect_every_pass_equal(mask);
+        ASSERT_FALSE(HasFatalFailure()) << "seed " << seed;
     }
 }
 

@@ -45,6 +45,7 @@ import android.graphics.Rect;
  * <p>Only {@link #init_objectsel}, {@link #inverse_objectsel} and {@link #reset_objectsel} check
  * arguments. Everywhere else an array that is null or shorter than its sizes say, a null rectangle
  * or point, or a rectangle that reaches beyond its array is not detected and may end the process.
+ * So does an array whose elements the virtual machine has no memory to hand out.
  * No method throws, {@link #nativeIntAlloc} apart.
  */
 public final class Util {

@@ -1,7 +1,6 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
 import com.velt.android.orvane.lumetrix.selection.CallListener;
-import java.io.IOException;
 
 /** Is told of each call on the library that the selection or its digest depends on. */
 interface CallLog extends CallListener, AutoCloseable {
@@ -12,5 +11,5 @@ interface CallLog extends CallListener, AutoCloseable {
     default void digest() {}
 
     @Override
-    default void close() throws IOException {}
+    default void close() throws OutputException {}
 }

@@ -4,7 +4,6 @@ import android.graphics.Point;
 import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.Mode;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
-import java.io.IOException;
 import java.util.List;
 import java.util.function.Function;
 import java.util.stream.IntStream;
@@ -18,7 +17,7 @@ public sealed interface Command {
     default void check(Photo photo) throws ScriptException {}
 
     /** Performs the command. */
-    void perform(Stage stage) throws IOException;
+    void perform(Stage stage) throws OutputException;
 
     /** Sets the brush for the strokes that follow. */
     record Brush(int line, int radius, int core) implements Command {
@@ -116,7 +115,7 @@ public sealed interface Command {
     record Snapshot(int line, String name, Function<SelectionSession, Picture> drawing)
             implements Command {
         @Override
-        public void perform(Stage stage) throws IOException {
+        public void perform(Stage stage) throws OutputException {
             stage.picture(name, drawing);
         }
     }

@@ -1,6 +1,11 @@
 package com.velt.android.orvane.lumetrix.desktop;
 
 import java.awt.image.BufferedImage;
+import java.io.IOException;
+import java.io.OutputStream;
+import javax.imageio.ImageIO;
+import javax.imageio.stream.ImageOutputStream;
+import javax.imageio.stream.MemoryCacheImageOutputStream;
 
 /**
  * A drawn picture.
@@ -18,5 +23,14 @@ public record Picture(int width, int height, int[] pixels) {
         BufferedImage image = new BufferedImage(width, height, type);
         image.setRGB(0, 0, width, height, pixels, 0, width);
         return image;
+    }
+
+    /** Writes the picture as PNG. */
+    public void write(OutputStream to) throws IOException {
+        try (ImageOutputStream out = new MemoryCacheImageOutputStream(to)) {
+            if (!ImageIO.write(toImage(), "png", out)) {
+                throw new IOException("no PNG writer in this Java");
+            }
+        }
     }
 }

@@ -7,7 +7,10 @@ import java.io.PrintStream;
 import java.nio.file.Files;
 import java.nio.file.InvalidPathException;
 import java.nio.file.Path;
+import java.util.HashMap;
 import java.util.List;
+import java.util.Map;
+import java.util.Optional;
 import java.util.function.Function;
 
 /**
@@ -33,7 +36,7 @@ public final class Player {
             "  --record FILE    write the calls on the library there, for a replay without Java",
             "  --help           this text",
             "",
-            "Status: 0 played, 1 played with another digest, 2 not played.",
+            "Status: 0 played, 1 played with another digest, 2 not played or not printed.",
             "",
             "A script is UTF-8 text, a command a line; # begins a comment. Commands:",
             "");
@@ -59,7 +62,7 @@ public final class Player {
     static int run(List<String> arguments, PrintStream out, PrintStream err) {
         if (arguments.contains("--help")) {
             out.println(HELP_HEAD + "\n  " + String.join("\n  ", ScriptParser.usages()));
-            return DONE;
+            return isPrinted(out, err) ? DONE : NOT_PLAYED;
         }
         Options options;
         try {
@@ -70,6 +73,7 @@ public final class Player {
         }
         try {
             Digest digest = new Player(options, out).play();
+            if (!isPrinted(out, err)) return NOT_PLAYED;
             if (digest.equals(options.expected().orElse(digest))) return DONE;
             err.println("Player: the selection has the digest " + digest + ", expected "
                     + options.expected().get());
@@ -86,9 +90,17 @@ public final class Player {
         return NOT_PLAYED;
     }
 
-    /** Prints a row for each command and keeps the pictures. */
-    private record PlayerStage(SelectionSession session, StrokeTable table, PictureFolder pictures)
-            implements Stage {
+    private static boolean isPrinted(PrintStream out, PrintStream err) {
+        if (!out.checkError()) return true;
+        err.println("Player: not everything could be printed, for the disk of the standard output"
+                + " is full or its reader has ended, expected another place for the standard"
+                + " output");
+        return false;
+    }
+
+    /** Prints a row for each command and writes the pictures. */
+    private record PlayerStage(SelectionSession session, StrokeTable table,
+            Map<String, OutputFile> pictures) implements Stage {
         @Override
         public void done(int line, String what, String where, Area changed) {
             table.row(line, what, where, changed, session.selectedPixels(), session.objectBox());
@@ -96,8 +108,9 @@ public final class Player {
 
         @Override
         public void picture(String name, Function<SelectionSession, Picture> drawing)
-                throws IOException {
-            pictures.write(name, drawing.apply(session));
+                throws OutputException {
+            Picture picture = drawing.apply(session);
+            pictures.get(name).write(picture::write);
         }
     }
 
@@ -105,16 +118,27 @@ public final class Player {
         Script script = readScript();
         Photo photo = readPhoto(script);
         for (Command command : script.commands()) command.check(photo);
-        try (PictureFolder pictures = openFolder(script.snapshots());
-                CallLog calls = openLog(photo);
-                SelectionSession session = open(photo, calls)) {
-            perform(script.commands(), new PlayerStage(session, new StrokeTable(out), pictures));
-            commit(script.snapshots(), pictures);
-            calls.digest();
-            Digest digest = Digest.of(session);
+        try (Outputs outputs = new Outputs(Map.of(options.script(), "the script",
+                photoOf(script), "the script's photo"))) {
+            Map<String, OutputFile> pictures = addPictures(outputs, script.snapshots());
+            Digest digest = play(script, photo, pictures, addRecording(outputs));
+            // Not before everything is written: session and recording are closed by now.
+            commit(outputs);
+            script.snapshots().forEach(snapshot -> out.println(placeOf(snapshot)));
             out.println("digest " + digest);
             return digest;
-        } catch (IOException e) {
+        }
+    }
+
+    private Digest play(Script script, Photo photo, Map<String, OutputFile> pictures,
+            Optional<OutputFile> recording) throws ScriptException {
+        try (CallLog calls = recording.isPresent() ? new Recording(recording.get(), photo)
+                        : CallLog.NONE;
+                SelectionSession session = open(photo, calls)) {
+            perform(script.commands(), new PlayerStage(session, new StrokeTable(out), pictures));
+            calls.digest();
+            return Digest.of(session);
+        } catch (OutputException e) {
             throw unrecordable(e);
         }
     }
@@ -132,7 +156,7 @@ public final class Player {
 
     private Photo readPhoto(Script script) throws ScriptException {
         try {
-            return Photo.read(options.script().resolveSibling(script.photo()));
+            return Photo.read(photoOf(script));
         } catch (IOException | InvalidPathException e) {
             throw new ScriptException(script.photoLine(), "the photo "
                     + Words.quote(script.photo()) + " cannot be read: " + e.getMessage(),
@@ -140,18 +164,36 @@ public final class Player {
         }
     }
 
-    private PictureFolder openFolder(List<Command.Snapshot> snapshots) throws ScriptException {
-        try {
-            return PictureFolder.open(options.out(),
-                    snapshots.stream().map(Command.Snapshot::name).toList());
-        } catch (IOException e) {
-            throw unwritable(snapshots.get(0), e);
-        }
+    private Path photoOf(Script script) {
+        return options.script().resolveSibling(script.photo());
     }
 
-    private CallLog openLog(Photo photo) throws IOException {
-        if (options.recording().isEmpty()) return CallLog.NONE;
-        return Recording.open(options.recording().get(), photo);
+    private Path placeOf(Command.Snapshot snapshot) {
+        return options.out().resolve(snapshot.name());
+    }
+
+    /** Finds out whether the pictures can be written, and makes their folder. */
+    private Map<String, OutputFile> addPictures(Outputs outputs, List<Command.Snapshot> snapshots)
+            throws ScriptException {
+        Map<String, OutputFile> pictures = new HashMap<>();
+        for (Command.Snapshot snapshot : snapshots) {
+            try {
+                outputs.makeFolder(options.out());
+                pictures.put(snapshot.name(), outputs.add(placeOf(snapshot)));
+            } catch (OutputException e) {
+                throw unwritable(snapshot, e);
+            }
+        }
+        return pictures;
+    }
+
+    private Optional<OutputFile> addRecording(Outputs outputs) throws ScriptException {
+        if (options.recording().isEmpty()) return Optional.empty();
+        try {
+            return Optional.of(outputs.add(options.recording().get()));
+        } catch (OutputException e) {
+            throw unrecordable(e);
+        }
     }
 
     private static SelectionSession open(Photo photo, CallLog calls) {
@@ -163,29 +205,29 @@ public final class Player {
         for (Command command : commands) {
             try {
                 command.perform(stage);
-            } catch (IOException e) {
-                throw unwritable(command, e);
+            } catch (OutputException e) {
+                throw unwritable((Command.Snapshot) command, e);  // no other command writes
             }
         }
     }
 
-    private void commit(List<Command.Snapshot> snapshots, PictureFolder pictures)
-            throws ScriptException {
+    private static void commit(Outputs outputs) throws ScriptException {
         try {
-            pictures.commit().forEach(out::println);
-        } catch (IOException e) {
-            throw unwritable(snapshots.get(0), e);
+            outputs.commit();
+        } catch (OutputException e) {
+            throw new ScriptException(ScriptException.WHOLE_FILE, "what is written cannot be put"
+                    + " into its place: " + e.getMessage(), e.expected());
         }
     }
 
-    private ScriptException unrecordable(IOException e) {
+    private ScriptException unrecordable(OutputException e) {
         return new ScriptException(ScriptException.WHOLE_FILE, "the calls cannot be written to "
-                + Words.quote(options.recording().orElseThrow().toString()) + ": " + e,
-                "a file to write to");
+                + Words.quote(options.recording().orElseThrow().toString()) + ": "
+                + e.getMessage(), e.expected());
     }
 
-    private ScriptException unwritable(Command command, IOException e) {
-        return new ScriptException(command.line(), "pictures cannot be written to "
-                + Words.quote(options.out().toString()) + ": " + e, "a folder to write to");
+    private ScriptException unwritable(Command.Snapshot snapshot, OutputException e) {
+        return new ScriptException(snapshot.line(), "the picture cannot be written to "
+                + Words.quote(placeOf(snapshot).toString()) + ": " + e.getMessage(), e.expected());
     }
 }

@@ -6,8 +6,6 @@ import java.io.IOException;
 import java.io.OutputStream;
 import java.nio.ByteBuffer;
 import java.nio.charset.StandardCharsets;
-import java.nio.file.Files;
-import java.nio.file.Path;
 
 /**
  * A file of a photo and the calls made on it, from which a program without Java or a JPEG decoder
@@ -17,8 +15,7 @@ import java.nio.file.Path;
  * photo and its pixels 0xAARRGGBB, row by row; then for each call a byte, its number, and its
  * arguments. Those of {@link NativeCall#SELECT} come after the number of its runs.
  *
- * <p>The photo is written at once and the calls when it is closed. A file that was not written to
- * its end lacks the call {@link NativeCall#DESTROY}.
+ * <p>Calls are kept until it is closed, and the file is written then.
  */
 final class Recording implements CallLog {
     /** The first eight bytes. */
@@ -27,37 +24,13 @@ final class Recording implements CallLog {
     private static final int DIGEST = 7;
     private static final int NUMBERS_OF_A_RUN = 3;
 
-    private final OutputStream file;
+    private final OutputFile file;
+    private final Photo photo;
     private final ByteArrayOutputStream calls = new ByteArrayOutputStream();
 
-    private Recording(OutputStream file) {
+    Recording(OutputFile file, Photo photo) {
         this.file = file;
-    }
-
-    /**
-     * Begins a recording, over an older one.
-     *
-     * @throws IOException when the file cannot be written
-     */
-    static Recording open(Path path, Photo photo) throws IOException {
-        Recording recording = new Recording(Files.newOutputStream(path));
-        try {
-            recording.write(photo);
-        } catch (IOException e) {
-            recording.file.close();
-            throw e;
-        }
-        return recording;
-    }
-
-    private void write(Photo photo) throws IOException {
-        file.write(MAGIC);
-        file.write(bytes(photo.width(), photo.height()));
-        int[] row = new int[photo.width()];
-        for (int y = 0; y < photo.height(); ++y) {
-            System.arraycopy(photo.pixels(), y * row.length, row, 0, row.length);
-            file.write(bytes(row));
-        }
+        this.photo = photo;
     }
 
     @Override
@@ -73,9 +46,20 @@ final class Recording implements CallLog {
     }
 
     @Override
-    public void close() throws IOException {
-        try (file) {
-            calls.writeTo(file);
+    public void close() throws OutputException {
+        file.write(out -> {
+            writePhoto(out);
+            calls.writeTo(out);
+        });
+    }
+
+    private void writePhoto(OutputStream out) throws IOException {
+        out.write(MAGIC);
+        out.write(bytes(photo.width(), photo.height()));
+        int[] row = new int[photo.width()];
+        for (int y = 0; y < photo.height(); ++y) {
+            System.arraycopy(photo.pixels(), y * row.length, row, 0, row.length);
+            out.write(bytes(row));
         }
     }
 

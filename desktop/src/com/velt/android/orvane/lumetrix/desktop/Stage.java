@@ -2,7 +2,6 @@ package com.velt.android.orvane.lumetrix.desktop;
 
 import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
-import java.io.IOException;
 import java.util.function.Function;
 
 /** What the commands of a script act on. */
@@ -28,7 +27,8 @@ public interface Stage {
      *
      * @param name the picture's file
      * @param drawing draws it
-     * @throws IOException when the picture cannot be written
+     * @throws OutputException when the picture cannot be written
      */
-    void picture(String name, Function<SelectionSession, Picture> drawing) throws IOException;
+    void picture(String name, Function<SelectionSession, Picture> drawing)
+            throws OutputException;
 }

@@ -31,17 +31,22 @@ public record ChildJvm(int status, String out, String err) {
             String... arguments) throws IOException, InterruptedException {
         Path out = scratch.resolve("child.out");
         Path err = scratch.resolve("child.err");
-        List<String> command = new ArrayList<>();
-        command.add(Path.of(System.getProperty("java.home"), "bin", "java").toString());
-        command.addAll(options);
-        command.addAll(List.of("-cp", classPath(), main.getName()));
-        command.addAll(List.of(arguments));
-        ProcessBuilder child = new ProcessBuilder(command)
+        ProcessBuilder child = new ProcessBuilder(command(options, main, arguments))
                 .redirectOutput(out.toFile())
                 .redirectError(err.toFile());
         child.environment().remove("DISPLAY");
         int status = child.start().waitFor();
         return new ChildJvm(status, read(out), read(err));
+    }
+
+    /** Returns the command that runs a class with the classes under test. */
+    static List<String> command(List<String> options, Class<?> main, String... arguments) {
+        List<String> command = new ArrayList<>();
+        command.add(Path.of(System.getProperty("java.home"), "bin", "java").toString());
+        command.addAll(options);
+        command.addAll(List.of("-cp", classPath(), main.getName()));
+        command.addAll(List.of(arguments));
+        return command;
     }
 
     private static String classPath() {

@@ -14,8 +14,8 @@ import java.io.IOException;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
-import java.util.Arrays;
 import java.util.List;
+import java.util.Map;
 import javax.imageio.ImageIO;
 import org.junit.jupiter.api.BeforeEach;
 import org.junit.jupiter.api.Test;
@@ -95,7 +95,8 @@ class RecordingTest {
     @Test
     void undoCannotBeRecordedAndIsRefusedBeforeItBegins() throws IOException {
         Photo photo = new Photo(3, 2, new int[6]);
-        try (Recording recording = Recording.open(file, photo);
+        try (Outputs outputs = new Outputs(Map.of());
+                Recording recording = new Recording(outputs.add(file), photo);
                 SelectionSession session =
                         new SelectionSession(photo.pixels(), 3, 2, 1000, recording)) {
             session.invert();
@@ -118,34 +119,32 @@ class RecordingTest {
     }
 
     @Test
-    void scriptThatFailsLeavesARecordingWithoutDigest() throws IOException {
+    void scriptThatFailsLeavesTheOlderRecording() throws IOException {
+        Files.writeString(file, "older");
         PlayerRun run = PlayerRun.of(
                 write("photo photo.png", "mask " + "x".repeat(300) + ".png"), "--out",
                 folder.resolve("out"), "--record", file);
         assertEquals(2, run.status());
-        byte[] calls = Files.readAllBytes(file);
-        assertArrayEquals(new byte[] {INIT, DESTROY},
-                Arrays.copyOfRange(calls, calls.length - 2, calls.length));
+        assertEquals("older", Files.readString(file));
     }
 
     @Test
     void fileThatCannotBeMadeIsRefusedBeforeTheFirstStroke() throws IOException {
-        assertRefused(folder.resolve("none").resolve("s.calls"));
-        assertRefused(folder);
-        assertRefused(Path.of("/dev/full"));
+        Path missing = folder.resolve("none");
+        assertRefused(missing.resolve("s.calls"), "there is no folder " + missing
+                + ", expected a folder that exists");
+        assertRefused(folder, "it is a folder, expected a file's name");
+        assertRefused(Path.of("/dev/full"), "it is a device or a pipe, expected an ordinary file");
     }
 
-    private void assertRefused(Path unwritable) throws IOException {
+    private void assertRefused(Path unwritable, String why) throws IOException {
         Path script = write("photo photo.png", "grow 1,1", "mask m.png");
         PlayerRun run = PlayerRun.of(script, "--out", folder.resolve("out"), "--record",
                 unwritable);
         assertEquals(2, run.status());
         assertEquals(List.of(), run.out());
-        assertEquals(1, run.err().size(), run.err().toString());
-        String line = run.err().get(0);
-        assertTrue(line.startsWith(script + ": the calls cannot be written to \"" + unwritable
-                + "\": "), line);
-        assertTrue(line.endsWith(", expected a file to write to"), line);
+        assertEquals(List.of(script + ": the calls cannot be written to \"" + unwritable + "\": "
+                + why), run.err());
         assertFalse(Files.exists(folder.resolve("out")));
     }
 

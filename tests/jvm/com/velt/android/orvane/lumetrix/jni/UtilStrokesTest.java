@@ -398,6 +398,22 @@ class UtilStrokesTest {
         begin(10, 1, "...");
         assertEquals(new Rect(1, 0, 1, 0), segment(LASSO_ADD, 1, 0, 1, 0, 0));
         assertMask(".#.");
+
+        begin(10, 1, "###");
+        assertEquals(new Rect(1, 0, 1, 0), segment(LASSO_REMOVE, 1, 0, 1, 0, 0));
+        assertMask("#4#");
+    }
+
+    @Test
+    void lassoOfOnePointDrawnAgainEndsAsFiveOrThree() {
+        for (int times : new int[] {2, 3}) {
+            begin(10, 1, ".");
+            for (int i = 0; i < times; ++i) segment(LASSO_ADD, 0, 0, 0, 0, 0);
+            assertMask("5");
+            begin(10, 1, "#");
+            for (int i = 0; i < times; ++i) segment(LASSO_REMOVE, 0, 0, 0, 0, 0);
+            assertMask("3");
+        }
     }
 
     @Test

@@ -33,6 +33,12 @@ class AreaTest {
     }
 
     @Test
+    void equalsNothingButAreas() {
+        assertFalse(AREA.equals((Object) AREA.toString()));
+        assertFalse(AREA.equals(null));
+    }
+
+    @Test
     void unionLeavesEmptyOnesOut() {
         assertEquals(AREA, AREA.union(Area.EMPTY));
         assertEquals(AREA, Area.EMPTY.union(AREA));

@@ -94,6 +94,12 @@ public final class RandomStrokes {
 
     private Deed lasso(Mode mode) {
         int[] corners = points(3 + random.nextInt(3));
+        if (random.nextInt(4) == 0) {
+            int again = 2 * random.nextInt(corners.length / 2);
+            int at = 2 * random.nextInt(corners.length / 2);
+            corners[at] = corners[again];
+            corners[at + 1] = corners[again + 1];
+        }
         return new Deed(mode + " " + Arrays.toString(corners), session.lasso(mode, corners));
     }
 

@@ -148,6 +148,80 @@ class SelectionSessionTest {
     }
 
     @Test
+    void repeatedCornerIsASegmentToItself() {
+        session.setFill(false);
+        for (Mode mode : List.of(Mode.LASSO_ADD, Mode.LASSO_REMOVE)) {
+            calls.clear();
+            session.lasso(mode, 2, 1, 5, 1, 5, 1, 5, 4, 2, 1);
+            String call = "MODIFY [" + mode.number() + ", 0, ";
+            assertEquals(List.of(call + "2, 1, 5, 1]", call + "5, 1, 5, 1]", call + "5, 1, 5, 4]",
+                    call + "5, 4, 2, 1]", call + "2, 1, 2, 1]"), calls);
+            String script = session.script("photo.png");
+            assertTrue(script.endsWith(mode + " 2,1 5,1 5,1 5,4 2,1\n"), script);
+        }
+    }
+
+    @Test
+    void repeatedCornerIsDrawnOnceMore() {
+        session.setFill(false);
+        session.lasso(Mode.LASSO_ADD, 1, 1, 1, 1, 1, 1);
+        assertMask("""
+            ........
+            .5......
+            ........
+            ........
+            ........
+            ........""");
+        session.reset();
+        session.invert();
+        Area changed = session.lasso(Mode.LASSO_REMOVE, 1, 1, 1, 1, 1, 1);
+        // The first segment finds 1 and leaves 4, the second makes 3 of it, the third leaves that.
+        assertMask("""
+            ########
+            #3######
+            ########
+            ########
+            ########
+            ########""");
+        assertEquals(new Area(1, 1, 1, 1), changed);
+    }
+
+    @Test
+    void onlyTheLastSegmentFillsAlsoWhenAnEarlierOneEndsAtTheFirstCorner() {
+        for (Mode mode : List.of(Mode.LASSO_ADD, Mode.LASSO_REMOVE)) {
+            calls.clear();
+            session.lasso(mode, 3, 2, 3, 2, 1, 4, 3, 2, 6, 4);
+            String call = "MODIFY [" + mode.number();
+            assertEquals(List.of(call + ", 0, 3, 2, 3, 2]", call + ", 0, 3, 2, 1, 4]",
+                    call + ", 0, 1, 4, 3, 2]", call + ", 0, 3, 2, 6, 4]",
+                    call + ", 1, 6, 4, 3, 2]"), calls);
+        }
+    }
+
+    @Test
+    void repeatedCornersChangeNothingOfAFilledLasso() {
+        int[] repeated = {2, 1, 2, 1, 5, 1, 5, 1, 5, 1, 5, 4, 2, 1, 2, 1};
+        session.lasso(Mode.LASSO_ADD, repeated);
+        assertMask("""
+            ........
+            ..####..
+            ...###..
+            ....##..
+            .....#..
+            ........""");
+        session.reset();
+        session.invert();
+        assertEquals(new Area(2, 1, 5, 4), session.lasso(Mode.LASSO_REMOVE, repeated));
+        assertMask("""
+            ########
+            ##....##
+            ###...##
+            ####..##
+            #####.##
+            ########""");
+    }
+
+    @Test
     void lassoReturnsAlsoWhatIsFilledOutsideItsOutline() {
         session.setFill(false);
         session.lasso(Mode.LASSO_ADD, 0, 0, 2, 0, 2, 2);

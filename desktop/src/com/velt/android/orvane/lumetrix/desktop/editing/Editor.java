@@ -339,16 +339,18 @@ public final class Editor implements AutoCloseable {
     /** Saves the selection, white on black, as PNG. The result tells whether it is saved. */
     public CompletableFuture<Boolean> saveMask(Path file) {
         return saveWork(file, () -> {
+            OpenedPhoto photo = document.photo;
             Picture mask = Drawings.mask(document.session);
-            return () -> PictureFiles.write(file, mask);
+            return () -> PictureFiles.write(file, mask, photo);
         });
     }
 
     /** Saves the photo with all that is not selected transparent, as PNG. */
     public CompletableFuture<Boolean> saveCutOut(Path file) {
         return saveWork(file, () -> {
+            OpenedPhoto photo = document.photo;
             Picture cutOut = document.cutOut();
-            return () -> PictureFiles.write(file, cutOut);
+            return () -> PictureFiles.write(file, cutOut, photo);
         });
     }
 
@@ -368,12 +370,13 @@ public final class Editor implements AutoCloseable {
     /** Saves what is seen of the photo, as PNG. The selection counts as unsaved still. */
     public CompletableFuture<Boolean> saveView(Path file) {
         return save(file, () -> {
+            OpenedPhoto photo = document.photo;
             List<Picture> seen = new ArrayList<>();
             screen.look(frame -> {
                 if (!frame.placement().seen().isEmpty()) seen.add(frame.seen());
             });
             if (seen.isEmpty()) throw new IllegalStateException("nothing of the photo is seen");
-            return () -> PictureFiles.write(file, seen.get(0));
+            return () -> PictureFiles.write(file, seen.get(0), photo);
         });
     }
 

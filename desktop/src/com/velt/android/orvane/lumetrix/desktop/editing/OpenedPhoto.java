@@ -7,6 +7,7 @@ import java.awt.RenderingHints;
 import java.awt.image.BufferedImage;
 import java.io.IOException;
 import java.nio.file.Path;
+import java.util.Map;
 
 /**
  * A photo to be edited, reduced when it has more pixels than strokes can follow.
@@ -59,6 +60,11 @@ public record OpenedPhoto(Path file, Photo photo, int fileWidth, int fileHeight)
 
     public int height() {
         return photo.height();
+    }
+
+    /** Returns what no file may be saved over, and what it is. */
+    Map<Path, String> asInput() {
+        return Map.of(file, "the photo that is open");
     }
 
     /** Tells whether the photo has fewer pixels than its file. */

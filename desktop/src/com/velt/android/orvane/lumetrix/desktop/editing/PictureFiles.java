@@ -1,53 +1,19 @@
 package com.velt.android.orvane.lumetrix.desktop.editing;
 
+import com.velt.android.orvane.lumetrix.desktop.OutputException;
+import com.velt.android.orvane.lumetrix.desktop.Outputs;
 import com.velt.android.orvane.lumetrix.desktop.Photo;
 import com.velt.android.orvane.lumetrix.desktop.Picture;
 import java.io.IOException;
-import java.io.OutputStream;
-import java.nio.file.Files;
 import java.nio.file.Path;
-import java.nio.file.StandardCopyOption;
-import javax.imageio.ImageIO;
-import javax.imageio.stream.ImageOutputStream;
-import javax.imageio.stream.MemoryCacheImageOutputStream;
 
-/** Reads masks, and writes files all or nothing: a write that fails leaves an older file alone. */
+/** Reads masks and writes pictures. */
 final class PictureFiles {
     private PictureFiles() {}
 
-    /** Writes a picture as PNG. */
-    static void write(Path file, Picture picture) throws IOException {
-        replace(file, temporary -> {
-            // By way of a stream of our own, which says why a file cannot be written.
-            try (OutputStream to = Files.newOutputStream(temporary);
-                    ImageOutputStream out = new MemoryCacheImageOutputStream(to)) {
-                if (!ImageIO.write(picture.toImage(), "png", out)) {
-                    throw new IOException("no PNG writer in this Java");
-                }
-            }
-        });
-    }
-
-    /** Writes a text in UTF-8. */
-    static void write(Path file, String text) throws IOException {
-        replace(file, temporary -> Files.writeString(temporary, text));
-    }
-
-    private interface Writing {
-        void to(Path temporary) throws IOException;
-    }
-
-    private static void replace(Path file, Writing writing) throws IOException {
-        Path folder = file.toAbsolutePath().getParent();
-        if (!Files.isDirectory(folder)) throw new IOException("there is no folder " + folder);
-        if (Files.isDirectory(file)) throw new IOException("there is a folder of this name");
-        Path temporary = folder.resolve("." + file.getFileName() + ".part");
-        try {
-            writing.to(temporary);
-            Files.move(temporary, file, StandardCopyOption.REPLACE_EXISTING);
-        } finally {
-            Files.deleteIfExists(temporary);
-        }
+    /** Writes a picture as PNG, but never over the photo that it was made from. */
+    static void write(Path file, Picture picture, OpenedPhoto photo) throws OutputException {
+        Outputs.write(file, photo.asInput(), picture::write);
     }
 
     /**

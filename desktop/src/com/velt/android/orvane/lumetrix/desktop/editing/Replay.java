@@ -1,12 +1,12 @@
 package com.velt.android.orvane.lumetrix.desktop.editing;
 
 import com.velt.android.orvane.lumetrix.desktop.Command;
+import com.velt.android.orvane.lumetrix.desktop.OutputException;
 import com.velt.android.orvane.lumetrix.desktop.Picture;
 import com.velt.android.orvane.lumetrix.desktop.Script;
 import com.velt.android.orvane.lumetrix.desktop.Stage;
 import com.velt.android.orvane.lumetrix.selection.Area;
 import com.velt.android.orvane.lumetrix.selection.SelectionSession;
-import java.io.IOException;
 import java.util.List;
 import java.util.function.BooleanSupplier;
 import java.util.function.Function;
@@ -31,7 +31,7 @@ final class Replay implements Stage {
     }
 
     /** Plays all commands and returns true, or false when it was stopped. */
-    boolean play() throws IOException {
+    boolean play() throws OutputException {
         try {
             for (Command command : commands) {
                 beforeDab();

@@ -1,15 +1,18 @@
 package com.velt.android.orvane.lumetrix.desktop.editing;
 
 import com.velt.android.orvane.lumetrix.desktop.Command;
+import com.velt.android.orvane.lumetrix.desktop.Outputs;
 import com.velt.android.orvane.lumetrix.desktop.Photo;
 import com.velt.android.orvane.lumetrix.desktop.Picture;
 import com.velt.android.orvane.lumetrix.desktop.Script;
 import com.velt.android.orvane.lumetrix.desktop.ScriptException;
 import com.velt.android.orvane.lumetrix.desktop.ScriptParser;
 import java.io.IOException;
+import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.InvalidPathException;
 import java.nio.file.Path;
+import java.util.Arrays;
 
 /** Reads and writes stroke scripts together with their photos. */
 final class ScriptFile {
@@ -91,13 +94,38 @@ final class ScriptFile {
         }
     }
 
-    /** Writes a script and, if its photo is a copy, that as well. */
+    /**
+     * Writes a script and, if its photo is a copy, that as well: both, or neither.
+     *
+     * @throws IOException when they cannot be written, or when the copy would replace a file that
+     *     holds anything else; the message says why
+     */
     static void write(Path file, String script, OpenedPhoto photo) throws IOException {
         Path named = photoOf(file, photo);
-        if (!named.equals(photo.file())) {
-            Photo copy = photo.photo();
-            PictureFiles.write(named, new Picture(copy.width(), copy.height(), copy.pixels()));
+        try (Outputs outputs = new Outputs(photo.asInput())) {
+            outputs.add(file).write(out -> out.write(script.getBytes(StandardCharsets.UTF_8)));
+            if (!named.equals(photo.file())) writeCopy(named, photo.photo(), outputs);
+            outputs.commit();
         }
-        PictureFiles.write(file, script);
+    }
+
+    private static void writeCopy(Path copy, Photo photo, Outputs outputs) throws IOException {
+        // Nobody was asked whether this name may be replaced.
+        if (Files.exists(copy)) {
+            if (isSame(copy, photo)) return;
+            throw new IOException("the photo has to be saved beside it as " + copy.getFileName()
+                    + ", and there is another file of this name");
+        }
+        Picture picture = new Picture(photo.width(), photo.height(), photo.pixels());
+        outputs.add(copy).write(picture::write);
+    }
+
+    private static boolean isSame(Path file, Photo photo) {
+        try {
+            Photo saved = Photo.read(file);
+            return saved.width() == photo.width() && Arrays.equals(saved.pixels(), photo.pixels());
+        } catch (IOException e) {
+            return false;  // no photo
+        }
     }
 }

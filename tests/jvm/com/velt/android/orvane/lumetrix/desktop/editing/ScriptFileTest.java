@@ -92,6 +92,37 @@ class ScriptFileTest {
         assertEquals(4, Photo.read(file).width());
     }
 
+    @Test
+    void scriptIsNotWrittenOverThePhoto() throws IOException {
+        Path file = Photos.save(folder.resolve("a.png"), 4, 2);
+        byte[] before = Files.readAllBytes(file);
+        OpenedPhoto photo = OpenedPhoto.read(file);
+        assertEquals("it is the photo that is open and would be replaced", assertThrows(
+                IOException.class, () -> ScriptFile.write(file, "photo a.png", photo))
+                .getMessage());
+        assertArrayEquals(before, Files.readAllBytes(file));
+    }
+
+    @Test
+    void copyOfAReducedPhotoReplacesNothingElse() throws IOException {
+        Path copy = Photos.save(folder.resolve("s-photo.png"), 2, 1);
+        Path script = Files.writeString(folder.resolve("s.strokes"), "older");
+        byte[] before = Files.readAllBytes(copy);
+        assertEquals("the photo has to be saved beside it as s-photo.png, and there is another file"
+                + " of this name", assertThrows(IOException.class, () -> ScriptFile.write(script,
+                "photo s-photo.png", reduced(folder.resolve("a.png")))).getMessage());
+        assertArrayEquals(before, Files.readAllBytes(copy));
+        assertEquals("older", Files.readString(script));
+    }
+
+    @Test
+    void scriptOfAReducedPhotoCanBeSavedAgain() throws IOException {
+        OpenedPhoto photo = reduced(folder.resolve("a.png"));
+        Path script = folder.resolve("s.strokes");
+        photoBack(script, photo);
+        assertArrayEquals(photo.photo().pixels(), photoBack(script, photo).photo().pixels());
+    }
+
     private String refusalOf(String script) throws IOException {
         Path file = Files.writeString(folder.resolve("s.strokes"), script);
         return assertThrows(IOException.class, () -> ScriptFile.read(file)).getMessage();
