@@ -3,7 +3,8 @@
 
 Each mutant is the library with one small deviation in one source: `<` for `<=`, a constant off by
 one, left for right, a statement left out. It is built and tested, with the quickest tests first,
-until one fails; cpp.py and java.py say how. Limits are processor time, so that a busy machine changes nothing.
+until one fails; cpp.py and java.py say how. Limits are processor time, so that a busy machine
+changes nothing.
 
 A mutant that no test notices has survived: either a test is missing, or no caller could tell the
 mutant from the library. The latter are listed with their reasons in survivors.txt. Mutants that do
@@ -13,9 +14,9 @@ test in which it hung takes 1,000 times as long as without it, and 20 seconds at
 
 The standard set is a part of all mutants that covers every file; --all takes all, --rest those
 outside the standard set. Results are kept in results.tsv under --work, and --resume takes what still
-holds from there; results.py says when. --report makes docs/mutation.md of them. Exits with 1 when a survivor is not explained, or an
-explanation no longer fits. The tree that holds this script is read only; everything is written under
---work.
+holds from there; results.py says when. --report makes docs/mutation.md of them. Exits with 1 when a
+survivor is not explained, or an explanation no longer fits. The tree that holds this script is read
+only; everything is written under --work.
 """
 
 import argparse
@@ -36,7 +37,7 @@ import java
 import report
 from mutants import LEFT_FOR_LATER, NO_TEST, PROCESSORS, ROOT, all_mutants, description, key, plain
 from mutants import processor_of, standard_set, title
-from results import ALIVE, KILLED, Results, state
+from results import ALIVE, KEPT, KILLED, Results, state
 from steps import StepFailed
 
 SURVIVORS = pathlib.Path(__file__).resolve().parent / "survivors.txt"
@@ -311,15 +312,17 @@ def chosen(everything, arguments):
 
 
 def write_report(everything, explained, work):
-    path = work / "results.tsv"
-    if not path.exists():
+    work.mkdir(parents=True, exist_ok=True)
+    results = Results(work / "results.tsv")
+    if not results.rows:
         sys.exit(f"there are no results in {work} to report")
-    new = report.table_of(everything, Results(path), lambda m: explains(explained, m))
+    new = report.table_of(everything, results, lambda m: explains(explained, m))
     table, alive = report.merged(*new, *report.read_tables(), explained)
     report.write_tables(table, alive)
+    results.keep()
     table, alive = report.read_tables()
     report.PAGE.write_text(report.page_of(table, alive, narrow(explained)))
-    say(f"written: {report.TABLE}, {report.UNEXPLAINED}, {report.PAGE}")
+    say(f"written: {KEPT}, {report.TABLE}, {report.UNEXPLAINED}, {report.PAGE}")
     return 0
 
 

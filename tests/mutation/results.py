@@ -6,6 +6,9 @@ the files it speaks:
   state   the mutated file and the library's headers that it includes
   whole   all sources of the library, and all that the tests are made of; for Java, those of Java
 
+The latest line of each mutant is also kept in the repository, in mutants.tsv.gz, so that a run on
+another machine can go on from there.
+
 A kill holds as long as `state` is the same: tests are only ever added, so what was noticed once
 still is. All else, a survivor above all, holds only while `whole` is the same too.
 """
@@ -14,12 +17,15 @@ import collections
 import csv
 import datetime
 import functools
+import gzip
 import hashlib
+import pathlib
 import re
 import subprocess
 
 from mutants import FOLDERS, JAVA, ROOT, description, key
 
+KEPT = pathlib.Path(__file__).resolve().parent / "mutants.tsv.gz"
 COLUMNS = ["file", "alike", "line", "change", "fate", "by", "seconds", "date", "commit", "state",
            "whole"]
 Row = collections.namedtuple("Row", COLUMNS)
@@ -84,19 +90,24 @@ def holds(row):
     return row.whole == whole(is_java(row.file))
 
 
+def rows_of(text):
+    """The latest row of each mutant."""
+    rows = {}
+    for fields in csv.reader(text.split("\n"), delimiter="\t", quoting=csv.QUOTE_NONE):
+        if len(fields) == len(COLUMNS) and fields != COLUMNS:  # not one that was cut off
+            row = Row(*fields)
+            rows[row_key(row)] = row
+    return rows
+
+
 class Results:
-    """The file of results, read and added to."""
+    """The file of results, read and added to. Without one, what the repository keeps."""
 
     def __init__(self, path):
         self.path = path
-        self.rows = {}
-        if path.exists():
-            with open(path, newline="") as file:
-                rows = list(csv.reader(file, delimiter="\t", quoting=csv.QUOTE_NONE))
-            for fields in rows:
-                if len(fields) == len(COLUMNS) and fields != COLUMNS:  # not one that was cut off
-                    row = Row(*fields)
-                    self.rows[row_key(row)] = row
+        if not path.exists() and KEPT.exists():
+            path.write_bytes(gzip.decompress(KEPT.read_bytes()))
+        self.rows = rows_of(path.read_text()) if path.exists() else {}
         self.commit = subprocess.run(["git", "-C", ROOT, "describe", "--always", "--dirty"],
                                      capture_output=True, text=True).stdout.strip() or "unknown"
 
@@ -111,6 +122,12 @@ class Results:
             content = content[:content.rfind("\n") + 1]
         self.path.write_text(content)
         self.file = open(self.path, "a")
+
+    def keep(self):
+        """Writes what the repository keeps: the same bytes for the same rows."""
+        lines = sorted("\t".join(row) for row in self.rows.values())
+        text = "".join(line + "\n" for line in ["\t".join(COLUMNS), *lines])
+        KEPT.write_bytes(gzip.compress(text.encode(), mtime=0))
 
     def known(self, mutant):
         """The row of a mutant, if one holds."""

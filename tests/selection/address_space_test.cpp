@@ -34,9 +34,8 @@ TEST(region_bits, AskForNoMoreBytesThanTheProcessCanCount) {
     EXPECT_EQ(out_of_memory.asked(), HAS_32_BITS ? 0 : 1);
 }
 
-// On a 64-bit machine such a brush takes many gigabytes. Under AddressSanitizer a 32-bit process
-// has no room for its map.
-#if PTRDIFF_MAX == INT32_MAX && !defined(DRAVENTA_SANITIZED)
+// On a 64-bit machine such a brush takes many gigabytes.
+#if PTRDIFF_MAX == INT32_MAX
 TEST(ER_selection_initial, AsksForNoArrayOfMoreBytesThanTheProcessCanCount) {
     ER_selection engine;
     failing_allocations counted(0);

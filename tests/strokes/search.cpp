@@ -68,10 +68,9 @@ public:
         expected = function(library, name);
         actual = function(deviant, name);
         definition = function(library, "new_plain_engine");
-        // In code that is run in the parent process, the deviant is never called.
     }
 
-    // Compares in this process.
+    // Compares in this process, which has to be one of its own: the deviant may end it.
     bool differ(const stroke_case& c) const { return !(play(expected, c) == play(actual, c)); }
 
     // Compares in a process of its own. One that ends otherwise than it should differs.
@@ -206,5 +205,6 @@ int main(int count, char** arguments) {
     }
     refuse(
         "find LIBRARY DEVIANT VERSION FILE SECONDS SEED NAME\n"
+        "        simplify LIBRARY DEVIANT VERSION FILE\n"
         "        check LIBRARY DEVIANT VERSION FILE");
 }

@@ -149,7 +149,7 @@ class Resuming(unittest.TestCase):
         self.write("tests/a_test.cpp", "// a test\n")
         self.write("draventaUtil.h", "")
         self.write("CMakeLists.txt", "")
-        patch = changed(results, ROOT=self.root)
+        patch = changed(results, ROOT=self.root, KEPT=self.root / "kept.gz")
         patch.__enter__()
         self.addCleanup(patch.__exit__, None, None, None)
         self.mutant = mutants.mutants_of("selection/a.cpp",
@@ -189,6 +189,17 @@ class Resuming(unittest.TestCase):
     def test_nothing_outlives_a_change_of_the_source_or_of_what_it_includes(self):
         for i, fate in enumerate(results.KILLED + results.ALIVE + results.NOT_COUNTED):
             self.assertFalse(self.run_and_change(fate, "selection/a.h", f"int g{i}();\n"), fate)
+
+    def test_what_the_repository_keeps_is_known_to_a_new_folder(self):
+        self.run_and_change("unit tests")
+        path = self.root / "build/results.tsv"
+        results.Results(path).keep()
+        first = results.KEPT.read_bytes()
+        path.unlink()
+        again = results.Results(path)
+        self.assertEqual(again.known(self.mutant).fate, "unit tests")
+        again.keep()
+        self.assertEqual(results.KEPT.read_bytes(), first)
 
     def test_a_line_that_was_cut_off_is_dropped(self):
         self.run_and_change("unit tests")
