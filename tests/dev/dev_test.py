@@ -50,7 +50,8 @@ class Project(unittest.TestCase):
         temporary = tempfile.TemporaryDirectory()
         self.addCleanup(temporary.cleanup)
         self.folder = pathlib.Path(temporary.name)
-        for name in ("dev", "tests/dev/test_figure.py", "tests/same_bits/same_bits.py",
+        for name in ("dev", "tests/dev/arguments.sh", "tests/dev/packages.sh", "tests/dev/table.sh",
+                     "tests/dev/test_figure.py", "tests/same_bits/same_bits.py",
                      "tests/same_bits/digests.txt", "tests/docs/pages.py",
                      "tests/docs/check_pages.py", "tests/docs/run_commands.py",
                      "tests/jvm/emulated_jdk.sh", "fuzz/CMakeLists.txt", "CMakePresets.json"):
@@ -379,6 +380,13 @@ class SameBits(Project):
         self.assertIn("short  queue                   5  0123456789abcdef\nlong",
                       (self.folder / "tests/same_bits/digests.txt").read_text())
 
+    def test_digests_of_scripts_are_read_as_the_replay_prints_them(self):
+        self.program("replay", "echo 'digest 8A9E14CF  some folder/fig.calls'")
+        result = self.same_bits("a=./replay", "b=./replay", update=True)
+        self.assertEqual(result.returncode, 0, result.stdout + result.stderr)
+        self.assertIn("short  fig.strokes             1  8A9E14CF\nlong",
+                      (self.folder / "tests/same_bits/digests.txt").read_text())
+
     def test_builds_that_disagree_write_nothing(self):
         self.expect("queue: 0123456789abcdef from a; 9123456789abcdef from b\n"
                     "same_bits: the builds disagree",
@@ -393,7 +401,7 @@ class SameBits(Project):
         self.expect("a: 'true' printed no digest; build it anew", "a=true", "b=true")
 
     def test_lines_that_are_no_digest_are_an_error(self):
-        for line in ("queue 0 0123456789abcdef", "queue 5", "queue 5 0123", "digest 12 a.calls"):
+        for line in ("queue 0 0123456789abcdef", "queue 5", "queue 5 0123", "digest 12  a.calls"):
             self.expect(f"printed no digest but '{line}'", f"a=echo {line}", f"b=echo {line}")
 
     def test_one_build_alone_is_refused(self):

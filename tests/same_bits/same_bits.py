@@ -2,7 +2,7 @@
 """Compares the digests of several builds of the library with the committed ones.
 
 Each build has programs that print a line "name cases digest" for each family of calls, or a line
-"digest DIGEST FILE" for each stroke script. All builds must give the same, and what digests.txt says.
+"digest DIGEST  FILE" for each stroke script. All builds must give the same, and what digests.txt says.
 """
 
 import argparse
@@ -46,7 +46,7 @@ def write_table(size, measured):
 def read_digest(line):
     """Reads a line that a program prints: (family, (cases, digest)). The latter is None if it is no
     digest of at least one case."""
-    script = re.fullmatch(r"digest ([0-9A-F]{8}) (\S+)", line)
+    script = re.fullmatch(r"digest ([0-9A-F]{8})  (.+)", line)
     if script:
         return pathlib.Path(script[2]).stem + ".strokes", ("1", script[1])
     family = re.fullmatch(r"(\S+) ([1-9]\d*) ([0-9a-f]{16})", line)
