@@ -12,6 +12,7 @@
 
 #include "jni/photo_columns.h"
 #include "jni/view_image.h"
+#include "jni/view_plain.h"
 #include "tests/helpers/guarded_buffer.h"
 #include "tests/helpers/picture.h"
 #include "tests/helpers/pixels.h"
@@ -31,13 +32,20 @@ outlined_photo with_mask(const Pixels& photo, const Picture& mask) {
     return {{photo.ints(), photo.width, photo.height}, mask.cells.data()};
 }
 
-// An empty view after draw_image_with_outline.
+// An empty view after draw_image_with_outline, of which the plain loops make the same.
+Pixels drawn(int width, int height, const outlined_photo& outlined, float scale, const offset& o,
+             const ze_rect& area) {
+    Pixels view(width, height, '.'), plain_view = view;
+    draw_image_with_outline({view.ints(), width}, outlined, scale, o.x, o.y, DASHES, area);
+    plain::draw_image_with_outline({plain_view.ints(), width}, outlined, scale, o.x, o.y, DASHES,
+                                   area);
+    EXPECT_EQ(plain_view, view) << "from the plain loops";
+    return view;
+}
+
 Pixels drawn(int width, int height, const Pixels& photo, const Picture& mask, float scale,
              const offset& o, const ze_rect& area) {
-    Pixels view(width, height, '.');
-    draw_image_with_outline({view.ints(), width}, with_mask(photo, mask), scale, o.x, o.y, DASHES,
-                            area);
-    return view;
+    return drawn(width, height, with_mask(photo, mask), scale, o, area);
 }
 
 // The same with the whole view redrawn.
@@ -51,11 +59,14 @@ Pixels drawn(const Pixels& photo, const Picture& mask) {
     return drawn(photo.width, photo.height, photo, mask, 1.0f, {0, 0});
 }
 
-// An empty view after draw_small_image_with_outline.
+// An empty view after draw_small_image_with_outline, of which the plain loops make the same.
 Pixels drawn_small(int width, int height, const Pixels& photo, const Picture& mask,
                    const ze_rect& area) {
-    Pixels view(width, height, '.');
+    Pixels view(width, height, '.'), plain_view = view;
     draw_small_image_with_outline({view.ints(), width}, with_mask(photo, mask), DASHES, area);
+    plain::draw_small_image_with_outline({plain_view.ints(), width}, with_mask(photo, mask), DASHES,
+                                         area);
+    EXPECT_EQ(plain_view, view) << "from the plain loops";
     return view;
 }
 
@@ -403,10 +414,9 @@ TEST(draw_image_with_outline, ANeighbourOutsideTheMaskMakesNoOutline) {
     for (const float scale : {2.0f, 3.0f, 6.0f, 1000.0f, 20000.0f}) {
         for (const int o : {1, 2}) {
             const int before = o - static_cast<int>(scale);
-            Pixels view("... ... ...");
-            draw_image_with_outline({view.ints(), 3}, outlined, scale, before, before, DASHES,
-                                    {0, 2, 0, 2});
-            EXPECT_EQ(view, Pixels("111 1a1 111")) << "scale " << scale << ", pixel " << o;
+            EXPECT_EQ(drawn(3, 3, outlined, scale, {before, before}, {0, 2, 0, 2}),
+                      Pixels("111 1a1 111"))
+                << "scale " << scale << ", pixel " << o;
         }
     }
 }
