@@ -341,7 +341,7 @@ TEST(ze_modify_mask, AveragesEachChannelRoundedDown) {
 }
 
 TEST(ze_modify_mask, SamplesTheDiagonalPixelAsOftenAsTheShorterSideIsLong) {
-    // Blocks start at 0, 2 and 5. The reference colour is (60 + 2 * 120) / 3 = 100; three samples
+    // Blocks start at 0, 2, 5 and 7. The reference colour is (60 + 2 * 120) / 3 = 100; three samples
     // of the diagonal pixel would make it 105.
     struct {
         const char* small;
@@ -351,6 +351,8 @@ TEST(ze_modify_mask, SamplesTheDiagonalPixelAsOftenAsTheShorterSideIsLong) {
     } const cases[] = {
         {".#. ..# ...", 1, 0, 2, 0, 5, 2},  // 3 x 2
         {"... #.. .#.", 0, 1, 0, 2, 2, 5},  // 2 x 3
+        {"... ... .#. ..#", 1, 2, 2, 5, 5, 7},  // 3 x 2
+        {".... ..#. ...#", 2, 1, 5, 2, 7, 5},   // 2 x 3
     };
     for (const auto& c : cases) {
         large_photo photo(8, 8, 0);
