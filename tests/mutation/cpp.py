@@ -453,7 +453,7 @@ class Trial:
         self.prove(build, stage, usual, [program, alone], test)
 
     def prove(self, build, stage, usual, command, by):
-        """What takes a thousand times as long as without the mutant hangs."""
+        """What takes a hundred times as long as without the mutant hangs."""
         outcome = self.run(build.command(*command),
                            max(PROOF_FACTOR * usual, PROOF_SECONDS), build.folder)
         if outcome.ran_out == PROCESSOR:

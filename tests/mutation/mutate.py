@@ -10,7 +10,7 @@ A mutant that no test notices has survived: either a test is missing, or no call
 mutant from the library. The latter are listed with their reasons in survivors.txt. Mutants that do
 not compile do not count, nor do those whose objects are the original's ("same code"). One that
 "hung" took longer than its limit, and counts as survived; it is "hung, proven" and killed when the
-test in which it hung takes 1,000 times as long as without it, and 20 seconds at least.
+test in which it hung takes 100 times as long as without it, and 20 seconds at least.
 
 The standard set is a part of all mutants that covers every file; --all takes all, --rest those
 outside the standard set. Results are kept in results.tsv under --work, and --resume takes what still
@@ -248,8 +248,10 @@ def print_outcome(rows, explained, everything):
     return killed, killed + len(alive), in_order, unexplained
 
 
-def write_summary(path, killed, counted, in_order, unexplained):
+def write_summary(path, killed, counted, in_order, unexplained, left):
     limit = "every survivor explained"
+    if left:
+        limit += f", {left} mutants left"
     if unexplained:
         limit += f", {len(unexplained)} not"
     elif not in_order:
@@ -379,10 +381,13 @@ def main():
         except StepFailed as error:
             sys.exit(str(error))
     killed, counted, in_order, unexplained = print_outcome(rows, explained, everything)
-    if len(rows) < len(mutants):
-        say(f"\n{len(mutants) - len(rows)} mutants are left for a run with --resume")
+    left_over = len(mutants) - len(rows)
+    if left_over:
+        say(f"\n{left_over} mutants are left for a run with --resume")
+    if not counted:
+        sys.exit("no mutant that compiles was run: give it more --minutes, or other --files")
     if arguments.summary:
-        write_summary(arguments.summary, killed, counted, in_order, unexplained)
+        write_summary(arguments.summary, killed, counted, in_order, unexplained, left_over)
     return 0 if in_order else 1
 
 
