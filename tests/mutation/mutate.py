@@ -10,7 +10,7 @@ A mutant that no test notices has survived: either a test is missing, or no call
 mutant from the library. The latter are listed with their reasons in survivors.txt. Mutants that do
 not compile do not count, nor do those whose objects are the original's ("same code"). One that
 "hung" took longer than its limit, and counts as survived; it is "hung, proven" and killed when the
-test in which it hung takes 100 times as long as without it, and 20 seconds at least.
+test in which it hung takes 100 times as long as without it, and 5 seconds at least.
 
 The standard set is a part of all mutants that covers every file; --all takes all, --rest those
 outside the standard set. Results are kept in results.tsv under --work, and --resume takes what still

@@ -138,7 +138,7 @@ MEANING = """## What the words mean
   2 seconds at least. Time on the clock plays no part, unless it is 60 times that. The test that was
   running is then run alone.
 - **Hung, proven.** That test takes more than 100 times the processor time that it takes without the
-  mutant, the start of the program aside, and 20 seconds at least. This counts as a kill. A test that
+  mutant, the start of the program aside, and 5 seconds at least. This counts as a kill. A test that
   ends before is no proof, nor is one that waits without using the processor: the mutant counts as
   alive.
 - **The same code.** The compiler makes the same objects of it, plainly or at `-O2`. Nobody could
