@@ -341,16 +341,16 @@ TEST(ze_modify_mask, AveragesEachChannelRoundedDown) {
 }
 
 TEST(ze_modify_mask, SamplesTheDiagonalPixelAsOftenAsTheShorterSideIsLong) {
-    // Blocks start at 0, 2, 5 and 7. The reference colour is (60 + 2 * 120) / 3 = 100; three samples
-    // of the diagonal pixel would make it 105.
+    // Blocks start at 0, 2, 5 and 7. The reference colour is (60 + 2 * 120) / 3 = 100; three
+    // samples of the diagonal pixel would make it 105.
     struct {
         const char* small;
         int x, y;    // the small pixel
         int bx, by;  // its block
         int next_bx, next_by;
     } const cases[] = {
-        {".#. ..# ...", 1, 0, 2, 0, 5, 2},  // 3 x 2
-        {"... #.. .#.", 0, 1, 0, 2, 2, 5},  // 2 x 3
+        {".#. ..# ...", 1, 0, 2, 0, 5, 2},      // 3 x 2
+        {"... #.. .#.", 0, 1, 0, 2, 2, 5},      // 2 x 3
         {"... ... .#. ..#", 1, 2, 2, 5, 5, 7},  // 3 x 2
         {".... ..#. ...#", 2, 1, 5, 2, 7, 5},   // 2 x 3
     };

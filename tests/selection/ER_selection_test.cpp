@@ -161,6 +161,22 @@ TEST(ER_selection_initial, TakesASquareBeyondAllMemoryForAFailedAllocation) {
     }
 }
 
+TEST(ER_selection_initial, AsksForNoMoreCellsThanAnIntCanCount) {
+    const struct {
+        int radius, asked;
+    } cases[] = {
+        {23169, 3},  // 2,147,302,921 cells: the queue, its index, and a brush that cannot be had
+        {23170, 2},  // 2,147,488,281
+    };
+    for (const auto& c : cases) {
+        ER_selection engine;
+        failing_allocations out_of_memory(3);
+        engine.initial(c.radius, 1);
+        EXPECT_EQ(out_of_memory.asked(), c.asked) << c.radius;
+        EXPECT_FALSE(has_buffers(engine)) << c.radius;
+    }
+}
+
 TEST(ER_selection_initial, TakesAnyCoreRadius) {
     EXPECT_EQ(brush(1, INT_MIN).classes(), Picture("### #2# ###"));
     EXPECT_EQ(brush(1, INT_MAX).classes(), Picture("### #3# ###"));

@@ -22,6 +22,7 @@ constexpr bool HAS_32_BITS = PTRDIFF_MAX == INT32_MAX;
 TEST(marker_bytes, AreNoneBeyondWhatTheProcessCanCount) {
     EXPECT_EQ(marker_bytes(46338, 46339), 46340u * 46341u) << "less than 2^31";
     EXPECT_EQ(marker_bytes(46339, 46339), HAS_32_BITS ? 0 : size_t{46341} * 46341);
+    EXPECT_EQ(marker_bytes(-1, -3), 0u) << "-1 byte";
     EXPECT_EQ(marker_bytes(50000, 50000), HAS_32_BITS ? 0 : size_t{50002} * 50002);
 }
 
