@@ -35,6 +35,19 @@ TEST(region_bits, AskForNoMoreBytesThanTheProcessCanCount) {
     EXPECT_EQ(out_of_memory.asked(), HAS_32_BITS ? 0 : 1);
 }
 
+TEST(region_bits, AskForNoMoreCellsThanAnIntCanCountAroundTheBox) {
+    const region_values selection = {value_set(1), value_set(), 1};
+    unsigned char pixel = 1;
+    constexpr int MOST = INT_MAX - 2 * WORD_BITS;
+    for (const int more : {0, 1}) {
+        failing_allocations out_of_memory(1, failing_allocations::FROM_THEN_ON);
+        const int n = MOST + more;
+        EXPECT_FALSE(region_bits(&pixel, n, 1, {0, n - 1, 0, 0}, selection));
+        EXPECT_FALSE(region_bits(&pixel, 1, n, {0, 0, 0, n - 1}, selection));
+        EXPECT_EQ(out_of_memory.asked(), HAS_32_BITS || more ? 0 : 2);
+    }
+}
+
 // On a 64-bit machine such a brush takes many gigabytes.
 #if PTRDIFF_MAX == INT32_MAX
 TEST(ER_selection_initial, AsksForNoArrayOfMoreBytesThanTheProcessCanCount) {
