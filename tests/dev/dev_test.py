@@ -401,7 +401,7 @@ class SameBits(Project):
         self.expect("a: 'true' printed no digest; build it anew", "a=true", "b=true")
 
     def test_lines_that_are_no_digest_are_an_error(self):
-        for line in ("queue 0 0123456789abcdef", "queue 5", "queue 5 0123", "digest 12  a.calls"):
+        for line in ("queue 0 0123456789abcdef", "queue 5", "queue 5 0123", "digest 12 a.calls"):
             self.expect(f"printed no digest but '{line}'", f"a=echo {line}", f"b=echo {line}")
 
     def test_one_build_alone_is_refused(self):
