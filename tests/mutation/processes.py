@@ -50,7 +50,7 @@ def run(command, seconds, folder=None, log=None):
     sparse gigabytes. Its output goes to the file `log`, or nowhere.
     """
     def limit():
-        resource.setrlimit(resource.RLIMIT_CPU, (int(seconds) + 1, int(seconds) + 2))
+        resource.setrlimit(resource.RLIMIT_CPU, (int(seconds) + 2, int(seconds) + 3))
         resource.setrlimit(resource.RLIMIT_CORE, (0, 0))
 
     with open(log or os.devnull, "wb") as sink:
@@ -83,7 +83,7 @@ def run(command, seconds, folder=None, log=None):
         _, status, usage = os.wait4(process.pid, 0)
         process.returncode = os.waitstatus_to_exitcode(status)
     used = max(used, usage.ru_utime + usage.ru_stime)
-    if used > seconds:
+    if used > seconds or process.returncode == -signal.SIGXCPU:
         ran_out = PROCESSOR
     ok = process.returncode == 0 and not ran_out and not too_large
     return Outcome(ok, ran_out, used, log)
