@@ -32,7 +32,7 @@ class Limits(unittest.TestCase):
     def test_each_program_is_limited_even_if_nobody_looks(self):
         with tempfile.NamedTemporaryFile("r") as log:
             processes.run(["sh", "-c", "ulimit -t; ulimit -c"], 7, log=log.name)
-            self.assertEqual(log.read(), "8\n0\n")
+            self.assertEqual(log.read(), "9\n0\n")
 
     def test_waiting_for_ever_is_told_from_hanging(self):
         factor, processes.CLOCK_FACTOR = processes.CLOCK_FACTOR, 0.5
